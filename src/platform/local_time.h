@@ -1,0 +1,53 @@
+// Local-time composition and breakdown in the process's time zone.
+//
+// Every call follows the zone as the C library sees it at that moment (`TZ`, else
+// /etc/localtime): a `TZ` changed with setenv between two calls is seen by the
+// second, by composition and breakdown alike.
+//
+// Instants are 64-bit seconds since 1970-01-01 00:00:00 UTC ("unix seconds");
+// local fields are also carried as "civil seconds", the same count taken as if
+// the zone were UTC (see civil.h). Both are accepted within +/-2^40.
+#ifndef DATETIMELIB_PLATFORM_LOCAL_TIME_H_
+#define DATETIMELIB_PLATFORM_LOCAL_TIME_H_
+
+#include <cstdint>
+#include <ctime>
+
+namespace datetimelib::platform {
+
+struct BrokenDownTime {
+  int year;                 // with century
+  int month;                // [1:12]
+  int day;                  // [1:31]
+  int hour;                 // [0:23]
+  int minute;               // [0:59]
+  int second;               // [0:59]
+  int weekday;              // [0:6], 0 == Sunday
+  int yearday;              // [0:365], 0 == 1 January
+  std::int32_t utc_offset;  // seconds east of UTC, daylight saving included
+  bool is_dst;
+  char abbreviation[16];  // zone abbreviation, NUL-terminated, possibly cut
+};
+
+// The local fields of an instant.
+BrokenDownTime BreakDownLocal(std::int64_t unix_seconds);
+
+// The UTC fields of an instant; abbreviation "GMT". Pure arithmetic.
+BrokenDownTime BreakDownUtc(std::int64_t unix_seconds);
+
+// The instant of a local time given as civil seconds.
+//
+// A local time skipped by a forward change of the clocks is read with the offset
+// in force before the change, so it lands after the change by the size of the gap
+// (02:30 on a spring-forward day gives 03:30 daylight time). A local time that
+// occurs twice gives the earlier instant. The result never depends on earlier
+// calls.
+std::int64_t ComposeLocal(std::int64_t civil_seconds);
+
+// The fields as a std::tm for strftime-style formatting. `tm_zone` points into
+// `fields`, which must outlive the result's use.
+std::tm ToTm(const BrokenDownTime& fields);
+
+}  // namespace datetimelib::platform
+
+#endif  // DATETIMELIB_PLATFORM_LOCAL_TIME_H_

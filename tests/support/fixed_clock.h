@@ -1,0 +1,24 @@
+// "Now" under test control. The test binary links tests/support/test_clock.cc in
+// place of the library's clock; it reads the real time until a FixedNow is alive.
+#ifndef DATETIMELIB_TESTS_SUPPORT_FIXED_CLOCK_H_
+#define DATETIMELIB_TESTS_SUPPORT_FIXED_CLOCK_H_
+
+#include <cstdint>
+#include <optional>
+
+namespace datetimelib::testing {
+
+void SetFixedNow(std::optional<std::int64_t> unix_seconds);
+
+// Fixes "now" at an instant for the lifetime of the guard.
+class FixedNow {
+ public:
+  explicit FixedNow(std::int64_t unix_seconds) { SetFixedNow(unix_seconds); }
+  ~FixedNow() { SetFixedNow(std::nullopt); }
+  FixedNow(const FixedNow&) = delete;
+  FixedNow& operator=(const FixedNow&) = delete;
+};
+
+}  // namespace datetimelib::testing
+
+#endif  // DATETIMELIB_TESTS_SUPPORT_FIXED_CLOCK_H_
