@@ -238,6 +238,34 @@ class DATETIMELIB_API AdDateTime {
   // "2001-09-09 01:46:40".
   std::string FormatGMT(const char* pattern) const;
 
+  // --- Parsing ---------------------------------------------------------------------
+  //
+  // Both members read the whole text (trailing blanks aside) in the calling
+  // thread's locale; every locale reads the canonical text "%Y-%m-%d %H:%M:%S".
+  // A text the thread's locale refuses whose 20th byte is "." (the canonical text
+  // with a fraction of a second) is read once more, cut to its first 19 bytes, in
+  // the user's default locale: "2003-05-17 14:03:09.250" reads as 14:03:09.
+  //
+  // Outcomes, whatever the value held before (a null text reads as ""):
+  //
+  //   text                      ParseDateTime            ParseDateTimeGMT
+  //   unreadable                invalid, keeps text      invalid, keeps text
+  //   outside 1970..2038-01-18  outOfRange, keeps text   outOfRange, keeps text
+  //   a time of day alone       valid, on 1970-01-01     outOfRange, keeps text
+  //   within the range          valid, as local time     valid, as UTC
+  //
+  // A refused text leaves the count unchanged (ParseDateTime's outOfRange: 0).
+  // Both return 1 when the value is now `valid`, else 0.
+
+  // Reads the text as local time, through the field constructor. `flags` is
+  // reserved and ignored.
+  // Example: ParseDateTime("2003-05-17 14:03:09") in New York gives 1053194589.
+  int ParseDateTime(const char* text, std::uint32_t flags = 0);
+
+  // Reads the text as UTC; no time zone enters.
+  // Example: ParseDateTimeGMT("2001-09-09 01:46:40") gives 1000000000.
+  int ParseDateTimeGMT(const char* text);
+
   // --- Calendar questions on this value's local date ------------------------------
   //
   // The free functions of the same names, asked of GetYear(), GetMonth() and

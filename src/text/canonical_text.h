@@ -1,0 +1,20 @@
+// The canonical text "%Y-%m-%d %H:%M:%S": the one form in which the library
+// writes values that it reads back, read here without any locale machinery.
+#ifndef DATETIMELIB_TEXT_CANONICAL_TEXT_H_
+#define DATETIMELIB_TEXT_CANONICAL_TEXT_H_
+
+#include <string_view>
+
+#include "text/date_time_fields.h"
+
+namespace datetimelib {
+
+inline constexpr char kCanonicalPattern[] = "%Y-%m-%d %H:%M:%S";
+
+// Reads exactly "YYYY-MM-DD HH:MM:SS" (digits in every place), followed by
+// nothing but blanks. Refuses fields that name no real date-time.
+bool ReadCanonical(std::string_view text, DateTimeFields* out);
+
+}  // namespace datetimelib
+
+#endif  // DATETIMELIB_TEXT_CANONICAL_TEXT_H_
