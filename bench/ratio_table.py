@@ -1,0 +1,105 @@
+#!/usr/bin/env python3
+"""Runs the benchmark binary and prints the ratio table.
+
+For each operation: datetimelib's median time, the fastest peer's median in the
+same run, their ratio (datetimelib / fastest peer) against the target, and the
+throughput of two threads over one for datetimelib and for the glibc baseline.
+
+Usage: ratio_table.py BENCHMARK_BINARY [--zones America/New_York,UTC]
+                      [--repetitions 5] [--min-time 0.3]
+"""
+import argparse
+import json
+import os
+import statistics
+import subprocess
+import sys
+
+# Operation -> (title, target ratio, glibc peer name)
+OPERATIONS = {
+    "Compose": ("field constructor", 1.0, "Mktime"),
+    "Breakdown": ("breakdown (a getter)", 1.0, "LocaltimeR"),
+    "FormatLocal": ("Format canonical, local", 0.5, "LocaltimeStrftime"),
+    "FormatCompact": ("FormatTolvane", 0.5, "LocaltimeStrftime"),
+    "FormatGmt": ("FormatGMT canonical", 0.4, "GmtimeStrftime"),
+    "ParseLocal": ("ParseDateTime canonical", 0.5, "StrptimeMktime"),
+    "ParseGmt": ("ParseDateTimeGMT canonical", 0.3, "StrptimeTimegm"),
+    "ParseCompact": ("ParseTolvaneDateTime", 1.0, "StrptimeMktime"),
+}
+# Targets that name one peer rather than the fastest of them.
+TARGET_PEER = {"Compose": "Abseil", "Breakdown": "Date", "FormatLocal": "LocaltimeStrftime",
+               "FormatCompact": "LocaltimeStrftime", "FormatGmt": "GmtimeStrftime",
+               "ParseLocal": "StrptimeMktime", "ParseGmt": "StrptimeTimegm",
+               "ParseCompact": "StrptimeMktime"}
+
+
+def run(binary, zone, repetitions, min_time):
+    env = dict(os.environ, TZ=zone)
+    out = subprocess.run(
+        [binary, f"--benchmark_repetitions={repetitions}",
+         f"--benchmark_min_time={min_time}", "--benchmark_format=json"],
+        env=env, check=True, capture_output=True, text=True).stdout
+    medians = {}   # (area, library, threads) -> (ns per item, items per second)
+    samples = {}
+    for row in json.loads(out)["benchmarks"]:
+        if row.get("run_type") != "iteration":
+            continue
+        name = row["run_name"] if "run_name" in row else row["name"]
+        # BM_<Area>_<Who>/real_time/threads:N
+        head, _, tail = name.partition("/")
+        _, area, who = head.split("_", 2)
+        threads = int(tail.rsplit("threads:", 1)[1])
+        samples.setdefault((area, who, threads), []).append(
+            (row["real_time"], row.get("items_per_second", 0.0)))
+    for key, rows in samples.items():
+        medians[key] = (statistics.median(r[0] for r in rows),
+                        statistics.median(r[1] for r in rows))
+    return medians
+
+
+def table(zone, medians):
+    lines = [f"TZ={zone}", "",
+             "| Operation | datetimelib | fastest peer | ratio | target (vs) | "
+             "2 threads / 1: datetimelib | glibc |",
+             "|---|---|---|---|---|---|---|"]
+    for area, (title, target, glibc) in OPERATIONS.items():
+        ours = medians.get((area, "Datetimelib", 1))
+        if ours is None:
+            continue
+        peers = {who: v for (a, who, t), v in medians.items()
+                 if a == area and t == 1 and who != "Datetimelib"}
+        if not peers:
+            continue
+        fastest = min(peers, key=lambda who: peers[who][0])
+        ratio = ours[0] / peers[fastest][0]
+        target_peer = TARGET_PEER[area]
+        target_ratio = (ours[0] / peers[target_peer][0]
+                        if target_peer in peers else float("nan"))
+        met = "met" if target_ratio <= target else "MISSED"
+
+        def scaling(who):
+            one = medians.get((area, who, 1))
+            two = medians.get((area, who, 2))
+            return f"{two[1] / one[1]:.2f}" if one and two and one[1] else "n/a"
+
+        lines.append(
+            f"| {title} | {ours[0]:.1f} ns | {fastest} {peers[fastest][0]:.1f} ns | "
+            f"{ratio:.2f} | {target_ratio:.2f} <= {target} {target_peer}, {met} | "
+            f"{scaling('Datetimelib')} | {scaling(glibc)} |")
+    return "\n".join(lines)
+
+
+def main():
+    parser = argparse.ArgumentParser()
+    parser.add_argument("binary")
+    parser.add_argument("--zones", default="America/New_York,UTC")
+    parser.add_argument("--repetitions", type=int, default=5)
+    parser.add_argument("--min-time", default="0.3")
+    args = parser.parse_args()
+    for zone in args.zones.split(","):
+        print(table(zone, run(args.binary, zone, args.repetitions, args.min_time)))
+        print()
+
+
+if __name__ == "__main__":
+    sys.exit(main())
