@@ -266,6 +266,25 @@ class DATETIMELIB_API AdDateTime {
   // Example: ParseDateTimeGMT("2001-09-09 01:46:40") gives 1000000000.
   int ParseDateTimeGMT(const char* text);
 
+  // --- The compact form: what people type -----------------------------------------
+  //
+  // "05-Jan-2003.14:07:09": day, English month abbreviation and year, then the
+  // time of day, in local time. The same text in every locale.
+
+  // The value's local time in the compact form "DD-Mon-YYYY.HH:MM:SS": day, hour,
+  // minute and second with two digits, the year in full, "Jan" to "Dec". A
+  // `valid` value always gives 20 characters.
+  //
+  // Unlike `Format`, it ignores the status and writes the count whatever the
+  // value holds: an `invalid` value after a refused parse gives the time it held
+  // before, an `outOfRange` value its count (0 when built from refused fields),
+  // never its kept text. It never changes the value.
+  //
+  // Example: with TZ=UTC, AdDateTime(AdTime(1000000000)).FormatTolvane() gives
+  // "09-Sep-2001.01:46:40"; in a zone one hour east, AdTime(0) gives
+  // "01-Jan-1970.01:00:00".
+  std::string FormatTolvane() const;
+
   // --- Calendar questions on this value's local date ------------------------------
   //
   // The free functions of the same names, asked of GetYear(), GetMonth() and
