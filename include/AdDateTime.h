@@ -266,6 +266,97 @@ class DATETIMELIB_API AdDateTime {
   // Example: ParseDateTimeGMT("2001-09-09 01:46:40") gives 1000000000.
   int ParseDateTimeGMT(const char* text);
 
+  // --- The compact form: what people type -----------------------------------------
+  //
+  // "05-Jan-2003.14:07:09": day, English month abbreviation and year, then the
+  // time of day, in local time. The same text in every locale.
+
+  // The value's local time in the compact form "DD-Mon-YYYY.HH:MM:SS": day, hour,
+  // minute and second with two digits, the year in full, "Jan" to "Dec". A
+  // `valid` value always gives 20 characters.
+  //
+  // Unlike `Format`, it ignores the status and writes the count whatever the
+  // value holds: an `invalid` value after a refused parse gives the time it held
+  // before, an `outOfRange` value its count (0 when built from refused fields),
+  // never its kept text. It never changes the value.
+  //
+  // Example: with TZ=UTC, AdDateTime(AdTime(1000000000)).FormatTolvane() gives
+  // "09-Sep-2001.01:46:40"; in a zone one hour east, AdTime(0) gives
+  // "01-Jan-1970.01:00:00".
+  std::string FormatTolvane() const;
+
+  // Sets this value from a date and time as a person types it: the compact form,
+  // looser forms of it, keywords, or "now". Fields are local time unless "UTC"
+  // follows the time. The status ends `valid` (empty kept text) or `invalid`,
+  // never `outOfRange` or `null`; read it with `IsValid`. A null text reads as "".
+  //
+  // Forms, with now Wednesday 2003-01-08 10:00:00. Words match in any ASCII case
+  // but must stand alone: " now" and "today " are refused.
+  //
+  //   text                          result
+  //   "now", "NOW"                  the current time
+  //   "today", "TODAY.12:30"        2003-01-08 00:00:00, 2003-01-08 12:30:00
+  //   "10:30", "10:30:15"           today at 10:30:00, at 10:30:15
+  //   "yesterday.23:59:59"          2003-01-07 23:59:59
+  //   "Sunday", "mon", "Sat"        2003-01-05, 2003-01-06, 2003-01-11 (this week)
+  //   "05-Jan-2003.14:07:09"        2003-01-05 14:07:09 (what FormatTolvane writes)
+  //   "5-jan-2003", "05-JANUARY-2003.9:5"
+  //                                 2003-01-05 00:00:00, 2003-01-05 09:05:00
+  //   "05-Jan", "31-Dec"            2003-01-05, 2002-12-31 (no year: see the note)
+  //   "31-Apr-2003", "00-Jan-2003"  2003-05-01, 2002-12-31 (carried)
+  //   "05-Jan-2003.25:00"           2003-01-06 01:00:00 (carried)
+  //   "05-Jan-2003.10:00:00.123"    2003-01-05 10:00:00 (the rest is ignored)
+  //   "05-Jan-2003.10:00UTC"        2003-01-05 10:00:00 UTC
+  //   "05-Jan-2003.10:00 UTC+2"     2003-01-05 12:00:00 UTC (see the note)
+  //   "05-Jan-2003.10:00UTC-1:30"   2003-01-05 08:30:00 UTC
+  //
+  // The grammar:
+  // * The first "." splits date from time. Without a ".", a text holding a ":"
+  //   is a time today, any other text a date at 00:00:00.
+  // * Date: "today", "yesterday", a weekday name (full or three letters), or
+  //   day "-" month ["-" year]. The day has one or two characters and starts
+  //   with a number up to 31 ("5x" reads 5; no lower bound, "00" is carried);
+  //   the month is a name, full or three letters ("Sept" is none); the year has
+  //   exactly four characters and starts with a number from 1969.
+  // * Time: hour ":" minute [":" second], numbers after optional blanks and
+  //   sign, anything after them ignored. No range test: hour 25 is carried.
+  // * After the time, "UTC" (upper case: "utc" is ignored text and the time
+  //   stays local), optionally with "+" or "-" and hours [":" minutes], at most
+  //   13 hours and 59 minutes.
+  //
+  // Refused, leaving the count and the kept text as they were (status
+  // `invalid`): a "." first or last ("05-Jan-2003.", ".10:00"); an unknown word
+  // ("tomorrow", "yesterday 10:00"); a "-" first or last ("-05-Jan", "05-Jan-");
+  // a bad day ("32-Jan", "2003-01-05"), month ("05-Sept") or year ("05-Jan-03");
+  // an offset without sign or number, or too large ("UTC2", "UTC+", "UTC+14",
+  // "UTC+5:60"); fewer than two time numbers ("05-Jan-2003.10",
+  // "05-Jan-2003.UTC"); any number beyond 32 bits.
+  //
+  // Refused after reading (status `invalid`): a date outside 1970-01-01 to
+  // 2038-01-18 ("05-Jan-1969", "05-Jan-2039"), and an empty text. The value
+  // holds what `ParseDateTime` or `ParseDateTimeGMT` left when handed the
+  // canonical text of the fields, or the text "%d/%d/%d %d:%d:%d" of fields the
+  // field constructor refused ("2039/1/5 0:0:0", "0/0/0 0:0:0"). An offset that
+  // would carry the count past 32 bits is refused too; the value then holds the
+  // instant read without it.
+  //
+  // Note: "UTC+2" adds two hours to the time read: "10:00 UTC+2" is 12:00 UTC,
+  //   not the 08:00 UTC that 10:00 in a zone two hours east of UTC would be.
+  // Note: a day and month without a year that lie after now, time of day
+  //   included, name the same day and time one year earlier: at 10:00 on
+  //   2003-01-08, "08-Jan.11:00" is 2002-01-08 11:00:00. A 29 February typed in a
+  //   year without one is carried to 1 March first ("29-Feb" early in 2005 is
+  //   2004-02-29; early in 2004, 2003-03-01).
+  // Note: a weekday name names its day in the Sunday-to-Saturday week of today,
+  //   which may lie ahead: "friday" on a Wednesday is two days later.
+  // Note: keywords count calendar days of local time: "yesterday" is the day
+  //   before today, also just after a daylight-saving change.
+  // Note: a local time that occurs twice when daylight saving ends gives its
+  //   first occurrence, so the compact text of an instant in the repeated hour
+  //   reads back one hour earlier; a local time skipped when it starts moves
+  //   forward by the gap. With "UTC" neither happens.
+  void ParseTolvaneDateTime(const char* text);
+
   // --- Calendar questions on this value's local date ------------------------------
   //
   // The free functions of the same names, asked of GetYear(), GetMonth() and
