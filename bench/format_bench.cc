@@ -121,7 +121,6 @@ void BM_FormatGmt_Date(benchmark::State& state) {
 DATETIMELIB_BENCHMARK(BM_FormatGmt_Date);
 #endif
 
-#if DATETIMELIB_BENCH_COMPACT
 void BM_FormatCompact_Datetimelib(benchmark::State& state) {
   const auto& counts = GetInputs().counts;
   std::size_t i = static_cast<std::size_t>(state.thread_index()) * 1000;
@@ -131,7 +130,6 @@ void BM_FormatCompact_Datetimelib(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations());
 }
 DATETIMELIB_BENCHMARK(BM_FormatCompact_Datetimelib);
-#endif
 
 void BM_FormatCompact_LocaltimeStrftime(benchmark::State& state) {
   const auto& counts = GetInputs().counts;

@@ -127,7 +127,6 @@ void BM_ParseGmt_Date(benchmark::State& state) {
 DATETIMELIB_BENCHMARK(BM_ParseGmt_Date);
 #endif
 
-#if DATETIMELIB_BENCH_COMPACT
 void BM_ParseCompact_Datetimelib(benchmark::State& state) {
   const auto& texts = GetInputs().compact_texts;
   std::size_t i = static_cast<std::size_t>(state.thread_index()) * 1000;
@@ -139,7 +138,6 @@ void BM_ParseCompact_Datetimelib(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations());
 }
 DATETIMELIB_BENCHMARK(BM_ParseCompact_Datetimelib);
-#endif
 
 void BM_ParseCompact_StrptimeMktime(benchmark::State& state) {
   const auto& texts = GetInputs().compact_texts;
