@@ -4,42 +4,18 @@
 
 #include <string>
 
+#include "support/rule_text.h"
+
 namespace {
 
 using datetimelib::platform::CivilDay;
 using datetimelib::platform::DaysFromCivil;
 using datetimelib::platform::DaysInMonth;
 using datetimelib::platform::ParsePosixRule;
-using datetimelib::platform::PosixRule;
 using datetimelib::platform::TransitionInYear;
 using datetimelib::platform::TransitionRule;
 using datetimelib::platform::WeekdayFromDays;
-
-std::string Describe(const TransitionRule& rule) {
-  std::string text;
-  switch (rule.form) {
-    case TransitionRule::Form::kMonthWeekDay:
-      text = "M" + std::to_string(rule.month) + "." + std::to_string(rule.week) + "." +
-             std::to_string(rule.weekday);
-      break;
-    case TransitionRule::Form::kJulian:
-      text = "J" + std::to_string(rule.day);
-      break;
-    case TransitionRule::Form::kZeroBased:
-      text = std::to_string(rule.day);
-      break;
-  }
-  return text + "@" + std::to_string(rule.time_seconds);
-}
-
-// "std east [dst east [start end]]", "dst?" marking a daylight name without rules.
-std::string Describe(const PosixRule& rule) {
-  std::string text = rule.std_abbreviation + " " + std::to_string(rule.std_seconds_east);
-  if (rule.dst == PosixRule::Dst::kNone) return text;
-  text += " " + rule.dst_abbreviation + " " + std::to_string(rule.dst_seconds_east);
-  if (rule.dst == PosixRule::Dst::kWithoutRules) return text + " no-rules";
-  return text + " " + Describe(rule.start) + " " + Describe(rule.end);
-}
+using datetimelib::testing::RuleText;
 
 TEST(ParsePosixRule, ReadsEveryPart) {
   const struct {
@@ -79,7 +55,7 @@ TEST(ParsePosixRule, ReadsEveryPart) {
     SCOPED_TRACE(c.text);
     const auto rule = ParsePosixRule(c.text);
     ASSERT_TRUE(rule.has_value());
-    EXPECT_EQ(Describe(*rule), c.expected);
+    EXPECT_EQ(RuleText(*rule), c.expected);
   }
 }
 
