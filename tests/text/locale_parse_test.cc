@@ -57,7 +57,9 @@ TEST(ParseDateTimeGMT, Outcomes) {
       {"2003-01-01 24:00:00", {0, AdDateTime::invalid, 777, ""}},
       {"2003-01-01 23:60:00", {0, AdDateTime::invalid, 777, ""}},
       {"2003-01-01 23:59:60", {0, AdDateTime::invalid, 777, ""}},
-      {"2003-01-01 23:59", {0, AdDateTime::invalid, 777, ""}},
+      {"2003-01-01 23", {0, AdDateTime::invalid, 777, ""}},
+      // Every locale reads a time without seconds.
+      {"2003-01-01 23:59", {1, AdDateTime::valid, 1041465540, ""}},
       {" 2003-01-01 23:59:59", {0, AdDateTime::invalid, 777, ""}},
       {"2003-01-01 23:59:59.", {1, AdDateTime::valid, 1041465599, ""}},
   };
