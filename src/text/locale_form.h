@@ -18,6 +18,9 @@
 //   %n %t     any number of blanks, none included
 //   other     itself, byte for byte
 //
+// strptime_l is not used: it takes 30 February and seconds 60 and 61, skips
+// blanks anywhere, and stops before the end of a text without saying so.
+//
 // Ranges are not tested while reading: the reader judges the fields once the
 // whole text is read. %Z and %z are left out of a form together with the
 // blank before them: a text naming a zone is refused rather than read in the

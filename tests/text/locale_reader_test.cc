@@ -202,6 +202,25 @@ TEST(ParseDateTime, ReadsWhatEachLocaleWrites) {
   }
 }
 
+// A time of day alone is read on 1899-12-30: local time on 1970-01-01, and out
+// of range as UTC.
+TEST(ParseDateTime, TimeOfDayAlone) {
+  DATETIMELIB_NEED_TEST_LOCALES();
+  TzGuard tz("America/New_York");
+  const ThreadLocale american("en_US.UTF-8");
+  for (const char* text : {"14:30", "14:30:00", "2:30 PM", "02:30:00 pm"}) {
+    SCOPED_TRACE(text);
+    AdDateTime local;
+    EXPECT_EQ(local.ParseDateTime(text), 1);
+    EXPECT_EQ(local.GetCTime().GetTime(), 19 * 3600 + 30 * 60);  // 14:30 EST
+    AdDateTime utc(AdTime(777));
+    EXPECT_EQ(utc.ParseDateTimeGMT(text), 0);
+    EXPECT_EQ(utc.GetStatus(), AdDateTime::outOfRange);
+    EXPECT_EQ(utc.GetCTime().GetTime(), 777);
+    EXPECT_EQ(utc.Format(kCanonical), text);
+  }
+}
+
 // The first read is in the calling thread's locale, the second (for the
 // canonical shape with a fraction) in the user's default locale.
 TEST(ParseDateTime, ThreadLocaleThenUserDefault) {
