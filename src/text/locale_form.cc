@@ -1,5 +1,7 @@
 #include "text/locale_form.h"
 
+#include <array>
+
 namespace datetimelib {
 namespace {
 
@@ -162,50 +164,26 @@ class FormBuilder {
 // A form gives a whole date, a whole time of day, or both; a 12-hour clock
 // needs its AM/PM word and a weekday needs a date to be checked against.
 bool Classify(ReadingForm* form) {
-  int years = 0, months = 0, days = 0, hours = 0, hours12 = 0, am_pm = 0, minutes = 0,
-      seconds = 0, weekdays = 0;
-  for (const FormToken& token : form->tokens) {
-    switch (token.step) {
-      case FormStep::kYear4:
-      case FormStep::kYear2:
-        ++years;
-        break;
-      case FormStep::kMonth:
-      case FormStep::kMonthName:
-        ++months;
-        break;
-      case FormStep::kDay:
-        ++days;
-        break;
-      case FormStep::kHour:
-        ++hours;
-        break;
-      case FormStep::kHour12:
-        ++hours12;
-        break;
-      case FormStep::kAmPm:
-        ++am_pm;
-        break;
-      case FormStep::kMinute:
-        ++minutes;
-        break;
-      case FormStep::kSecond:
-        ++seconds;
-        break;
-      case FormStep::kWeekdayName:
-        ++weekdays;
-        break;
-      default:
-        break;
-    }
-  }
-  const int date_steps = years + months + days;
-  const int time_steps = hours + hours12 + minutes + seconds;
+  constexpr std::size_t kSteps = static_cast<std::size_t>(FormStep::kWeekdayName) + 1;
+  std::array<int, kSteps> counts{};
+  for (const FormToken& token : form->tokens)
+    ++counts[static_cast<std::size_t>(token.step)];
+  const auto count = [&counts](FormStep step) {
+    return counts[static_cast<std::size_t>(step)];
+  };
+  const int years = count(FormStep::kYear4) + count(FormStep::kYear2);
+  const int months = count(FormStep::kMonth) + count(FormStep::kMonthName);
+  const int days = count(FormStep::kDay);
+  const int hours = count(FormStep::kHour) + count(FormStep::kHour12);
+  const int minutes = count(FormStep::kMinute);
+  const int seconds = count(FormStep::kSecond);
+  const int weekdays = count(FormStep::kWeekdayName);
+
   form->has_date = years == 1 && months == 1 && days == 1;
-  form->has_time = hours + hours12 == 1 && minutes == 1 && seconds <= 1;
-  if (date_steps != 0 && !form->has_date) return false;
-  if (time_steps != 0 && !form->has_time) return false;
-  if (hours12 != am_pm) return false;
+  form->has_time = hours == 1 && minutes == 1 && seconds <= 1;
+  if (years + months + days != 0 && !form->has_date) return false;
+  if (hours + minutes + seconds != 0 && !form->has_time) return false;
+  if (count(FormStep::kHour12) != count(FormStep::kAmPm)) return false;
   if (weekdays > 1 || (weekdays == 1 && !form->has_date)) return false;
   return form->has_date || form->has_time;
 }

@@ -55,7 +55,7 @@ enum class FormStep {
   kMinute,
   kSecond,
   kAmPm,
-  kWeekdayName,
+  kWeekdayName,  // the last: Classify counts steps up to it
 };
 
 struct FormToken {

@@ -62,15 +62,4 @@ TEST(LocaleHandle, ThreadLocaleOrProcessLocale) {
   std::setlocale(LC_TIME, "C");
 }
 
-TEST(LocaleHandle, MovesOwnership) {
-  LocaleHandle first = LocaleHandle::Invariant();
-  const locale_t held = first.get();
-  LocaleHandle second = std::move(first);
-  EXPECT_EQ(second.get(), held);
-  EXPECT_EQ(first.get(),
-            nullptr);  // NOLINT(bugprone-use-after-move): moved-from is empty
-  second = LocaleHandle::Invariant();
-  EXPECT_NE(second.get(), nullptr);
-}
-
 }  // namespace
