@@ -1,6 +1,8 @@
 // Daylight-saving dates from the table file dst_dates.dat, else from the rule.
 #include <cstring>
-#include <string_view>
+#include <optional>
+#include <string>
+#include <utility>
 
 #include "AdDateTime.h"
 #include "platform/regular_file.h"
