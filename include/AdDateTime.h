@@ -238,10 +238,46 @@ class DATETIMELIB_API AdDateTime {
   // "2001-09-09 01:46:40".
   std::string FormatGMT(const char* pattern) const;
 
+  // Flag words of `Format(flags, locale)`: what of the value the locale writes.
+  enum AdFormatFlags : std::uint32_t {
+    dateAndTime = 0,  // the locale's date, a blank, its time of day: "%x %X"
+    timeOnly = 1,     // the locale's time of day: "%X"
+    dateOnly = 2,     // the locale's date: "%x"
+  };
+
+  // Locale identifiers with a meaning of their own. Any other number names a
+  // language and region: 1033 en_US, 2057 en_GB, 1031 de_DE, 1036 fr_FR, 1040
+  // it_IT, 3082 es_ES, 1043 nl_NL, 1046 pt_BR, 1049 ru_RU, 1041 ja_JP, 2052
+  // zh_CN, 1042 ko_KR, and some forty more.
+  enum AdLocale : std::uint32_t {
+    invariantLocale = 127,       // "C"
+    userDefaultLocale = 1024,    // named by LC_ALL, else LC_TIME, else LANG
+    systemDefaultLocale = 2048,  // the process-wide locale that setlocale set
+  };
+
+  // The value in local time as a locale writes it (strftime's %x and %X of that
+  // locale, in its encoding). Bits other than `timeOnly` and `dateOnly` are
+  // ignored; both together write the date and the time.
+  // An unknown identifier, or a locale that is not installed, writes as "C".
+  // Example: 2003-05-17 14:03:09 gives "05/17/2003 02:03:09 PM" in 1033,
+  // "17.05.2003" with `dateOnly` in 1031, and "14:03:09" with `timeOnly` in 127.
+  // Note: `ParseDateTime` reads this text back on a thread whose locale is the
+  // one that wrote it; other locales may read it differently or not at all.
+  std::string Format(std::uint32_t flags, std::uint32_t locale) const;
+
   // --- Parsing ---------------------------------------------------------------------
   //
   // Both members read the whole text (trailing blanks aside) in the calling
   // thread's locale; every locale reads the canonical text "%Y-%m-%d %H:%M:%S".
+  // Every locale also reads: that text with "T" for the blank; a date alone (at
+  // 00:00:00); a time of day alone ("14:30", "14:30:00", "2:30 PM" where the
+  // locale has AM/PM words; on 1970-01-01 by the field constructor's rule);
+  // the locale's own date, time and date-time forms, so that what
+  // `Format(flags, locale)` writes reads back in that locale; and dates with the
+  // locale's month names, full or short, in any case ("17 MÄRZ 2003", "May 17,
+  // 2003"). A two-digit year is read only where the locale writes one: 69..99
+  // are 1969..1999, 00..68 are 2000..2068. Impossible fields (30 February, hour
+  // 24, second 60) make the text unreadable.
   // A text the thread's locale refuses whose 20th byte is "." (the canonical text
   // with a fraction of a second) is read once more, cut to its first 19 bytes, in
   // the user's default locale: "2003-05-17 14:03:09.250" reads as 14:03:09.
@@ -366,6 +402,86 @@ class DATETIMELIB_API AdDateTime {
   long GetDaysInMonth() const;
   AdDateTime GetWeekStartDate() const;
   AdDateTime GetWeekEndDate() const;
+
+  // --- Time zone and daylight saving ------------------------------------------
+  //
+  // Questions about the process's time zone, read afresh at every call: a `TZ`
+  // changed with setenv between two calls is seen by the second. The zone is the
+  // one the C library uses (`TZ` as a zone name under `TZDIR` or
+  // /usr/share/zoneinfo, or as a POSIX rule string; `/etc/localtime` when `TZ` is
+  // unset). Its rule is the one in force today (for a zone file, the rule string
+  // at the end of its data), applied to every year asked about: a zone that
+  // changed its rule in 2007 gets the new rule for 2006 too.
+
+  // The offset of the zone's standard time from GMT in minutes, truncated toward
+  // zero, positive WEST of Greenwich. Daylight saving never enters, so the
+  // result is the same in summer and in winter.
+  // Example: 300.0 in New York (UTC-5), -60.0 in Berlin (UTC+1), -330.0 in
+  // Kolkata (UTC+5:30), 205.0 for a standard time 12 345 s behind UTC.
+  // Note: the sign is the opposite of "UTC+1". Europe/Dublin gives -60.0: its
+  // rule takes Irish summer time as standard time and winter as the daylight part.
+  static double GetGMTOffset();
+
+  // 1 when the zone's current rule has daylight saving, else 0, whatever the
+  // season. Zones that had it in the past only give 0 (Asia/Tokyo, Asia/Kolkata,
+  // Europe/Moscow, America/Sao_Paulo).
+  static int UsesDST();
+
+  // The local date-times at which daylight saving starts and ends in `year` under
+  // the zone's current rule, in the canonical pattern "%Y-%m-%d %H:%M:%S":
+  //
+  //   start  the last second before the change to daylight time: the rule's
+  //          local time of the change minus one second;
+  //   end    the local time of the change back, as the clock reads it just
+  //          before the change.
+  //
+  // The days are the rule's own: its weekday in its week of the month (the
+  // second Sunday of March, the last Sunday of October), or a day of the year.
+  // A time of the change outside 00:00-24:00 carries into the neighbouring day.
+  // Both days lie in `year`, so south of the equator the end comes first.
+  //
+  // Returns 1 always. In a zone without daylight saving both texts are emptied.
+  // Where a date lies outside 1970-01-01..2038-01-18, its text is the one an
+  // `outOfRange` value keeps for those fields ("2039/3/13 1:59:59").
+  //
+  // Example: New York (",M3.2.0,M11.1.0", changes at 02:00), 2007: start
+  // "2007-03-11 01:59:59", end "2007-11-04 02:00:00". Sydney, 2010: start
+  // "2010-10-03 01:59:59", end "2010-04-04 03:00:00".
+  // Note: Europe/Dublin follows its rule as written, winter being the daylight
+  // part: for 2008 the start is "2008-10-26 01:59:59" and the end, earlier in the
+  // same year, "2008-03-30 01:00:00".
+  static int GenerateDSTDates(int year, std::string& start, std::string& end);
+
+  // The start and end of daylight saving in `year`, from the table file
+  // `directory` + "/dst_dates.dat" when it has an entry for the year, else as
+  // GenerateDSTDates computes them. The result does not say which.
+  //
+  // Returns 0 with both texts emptied when the zone's current rule has no
+  // daylight saving (no table is then read), else 1 with both texts written.
+  //
+  // The table is read afresh at every call, line by line, for example:
+  //
+  //   # Daylight saving as our region decided it
+  //   2003-04-06 01:59:59;2003-10-26 02:00:00
+  //   2004-04-04 01:59:59;2004-10-31 02:00:00
+  //
+  // * A line ends at "\n", and a "\r" before it is dropped; the last line needs
+  //   no line end.
+  // * A line whose very first character is "#" is a comment (" #" is not).
+  // * Every other line is an entry: the start text before its first ";", the
+  //   end text after it. Neither is trimmed. Each is read with ParseDateTime and
+  //   must give a valid value; a line that does not is passed over, as is a line
+  //   without ";" or starting with it.
+  // * An entry belongs to the local year of its start; its end may lie later.
+  //   The first entry of the year in file order is taken.
+  // * The texts handed back are the two values written in the canonical pattern
+  //   in local time, whatever form the entry used.
+  // * No table: a null `directory`, no such file, or a name that is not a
+  //   regular file (a directory, a FIFO or a device is never read, so a call
+  //   never waits). Lines longer than 4096 bytes or holding a NUL byte are
+  //   passed over like unreadable ones.
+  static int GetDSTDates(const char* directory, int year, std::string& start,
+                         std::string& end);
 
  private:
   // ----------------------------------------------------------------------------

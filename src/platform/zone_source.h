@@ -13,7 +13,11 @@
 // A rule string with a daylight name and no transition rules ("EST5EDT" when no
 // zone file of that name exists) takes its transitions from the "posixrules" zone
 // file of the same folder, when that file has at least two local time types, and
-// otherwise from ",M3.2.0,M11.1.0", as the C library does.
+// otherwise from ",M3.2.0,M11.1.0", as the C library does. The rule keeps those
+// transitions' own local times. glibc 2.36 does not quite: it moves the file's
+// transition instants by an amount that depends on TZ's offsets, so with the
+// usual posixrules (America/New_York) localtime_r changes at 06:00 in spring
+// under TZ=XST3XDT, and at 22:00 the evening before in autumn under XST5XDT.
 //
 // All file access of the zone layer happens here, and nothing is kept between
 // calls: every call reads TZ, TZDIR and the files afresh. Files are read only

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 
+#include <optional>
 #include <string>
 
 #include "support/env_guard.h"
@@ -113,31 +114,23 @@ TEST_F(ZoneSourceTest, UnreadableLocalZoneIsUtc) {
 // library's own ",M3.2.0,M11.1.0"; names and offsets always from TZ.
 TEST_F(ZoneSourceTest, DaylightNameWithoutRules) {
   const char* const kFallback = "XST -10800 XDT -7200 M3.2.0@7200 M11.1.0@7200";
+  TzifParts one_type;
+  one_type.types = {{-10800, 0, 0}};
+  one_type.designations = std::string("FST\0", 4);
+  one_type.footer = kFooter;
   const struct {
-    const char* posixrules;  // nullptr: no such file
+    std::optional<std::string> posixrules;  // what the file holds, if there is one
     const char* rule;
   } cases[] = {
-      {nullptr, kFallback},
+      {std::nullopt, kFallback},
       {"", kFallback},  // not a zone file
-      {"posix file", "XST -10800 XDT -7200 M4.1.0@7200 M10.5.0@10800"},
-      {"one type", kFallback},
-      {"no rule in its footer", kFallback},
+      {ZoneFile(kFooter), "XST -10800 XDT -7200 M4.1.0@7200 M10.5.0@10800"},
+      {TzifBytes(one_type), kFallback},
+      {ZoneFile("\nGST-1\n"), kFallback},  // no rule in its footer
   };
   for (const auto& c : cases) {
-    SCOPED_TRACE(c.posixrules == nullptr ? "(none)" : c.posixrules);
     TempDir folder;
-    const std::string which = c.posixrules == nullptr ? "" : c.posixrules;
-    if (which == "posix file") folder.Write("posixrules", ZoneFile(kFooter));
-    if (which == "no rule in its footer")
-      folder.Write("posixrules", ZoneFile("\nGST-1\n"));
-    if (which == "") folder.Write("posixrules", "");
-    if (which == "one type") {
-      TzifParts parts;
-      parts.types = {{-10800, 0, 0}};
-      parts.designations = std::string("FST\0", 4);
-      parts.footer = kFooter;
-      folder.Write("posixrules", TzifBytes(parts));
-    }
+    if (c.posixrules) folder.Write("posixrules", *c.posixrules);
     ZoneSettings settings;
     settings.zone_folder = folder.path();
     for (const char* tz : {"XST3XDT", "XST3XDT,"}) {
