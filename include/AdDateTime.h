@@ -138,11 +138,13 @@ class DATETIMELIB_API AdDateTime {
   //
   // Example: AdDateTime(2038, 1, 19, 0, 0, 0).Format(...) gives "2038/1/19 0:0:0".
   //
-  // Note: a local time that a change to daylight saving skips moves forward by
-  // the size of the change (02:30 on a spring-forward day gives 03:30 daylight
-  // time). A local time that occurs twice gives the first occurrence, the
-  // daylight reading in zones that move their clocks ahead in summer. Unlike
-  // `mktime`, the answer never depends on earlier calls.
+  // Note: a local time that a change skips lands on the daylight side of the
+  // change, as `mktime` puts it: forward by the size of the change where daylight
+  // time is summer time (02:30 on a spring-forward day gives 03:30 daylight
+  // time), back where a zone writes its winter as daylight time (Europe/Dublin:
+  // 01:30 on 2019-03-31 gives 00:30 GMT). A local time that occurs twice gives the
+  // first occurrence, the daylight reading in zones that move their clocks ahead
+  // in summer. Unlike `mktime`, the answer never depends on earlier calls.
   AdDateTime(long year, long month, long day, long hour, long minute, long second);
 
   AdDateTime(const AdDateTime& other) = default;

@@ -30,7 +30,8 @@ RuleChanges ChangesForUtcYear(const PosixRule& rule, std::int64_t utc_year) {
 
 bool RuleIsDstAt(const PosixRule& rule, std::int64_t unix_seconds) {
   if (rule.dst != PosixRule::Dst::kWithRules) return false;
-  const std::int64_t utc_year = CivilFromDays(FloorDiv(unix_seconds, kSecondsPerDay)).year;
+  const std::int64_t utc_year =
+      CivilFromDays(FloorDiv(unix_seconds, kSecondsPerDay)).year;
   const RuleChanges changes = ChangesForUtcYear(rule, utc_year);
   if (changes.dst_start > changes.dst_end) {
     return unix_seconds < changes.dst_end || unix_seconds >= changes.dst_start;

@@ -20,7 +20,8 @@ constexpr std::size_t kPeriodsToLookBack = 4;
 
 std::size_t ZoneTimeline::PeriodAt(std::int64_t unix_seconds) const {
   const auto after = std::upper_bound(starts_.begin(), starts_.end(), unix_seconds);
-  return static_cast<std::size_t>(after - starts_.begin()) - 1;  // starts_[0] is the minimum
+  return static_cast<std::size_t>(after - starts_.begin()) -
+         1;  // starts_[0] is the minimum
 }
 
 const ZoneTimeline::LocalType& ZoneTimeline::TypeAt(std::int64_t unix_seconds) const {
@@ -69,12 +70,14 @@ std::int64_t ZoneTimeline::Compose(std::int64_t civil_seconds) const {
   const std::size_t first = last >= kPeriodsToLookBack ? last - kPeriodsToLookBack : 0;
   for (std::size_t i = first; i <= last; ++i) {
     const std::int32_t offset = types_[period_types_[i]].utc_offset;
-    const bool ends_after = i + 1 == starts_.size() || civil_seconds < starts_[i + 1] + offset;
+    const bool ends_after =
+        i + 1 == starts_.size() || civil_seconds < starts_[i + 1] + offset;
     if (local_starts_[i] <= civil_seconds && ends_after) return civil_seconds - offset;
   }
   // Skipped by the change that starts the next period.
   const std::size_t next = std::min(last + 1, starts_.size() - 1);
-  return ChooseInGap(civil_seconds, types_[period_types_[last]], types_[period_types_[next]]);
+  return ChooseInGap(civil_seconds, types_[period_types_[last]],
+                     types_[period_types_[next]]);
 }
 
 // Two instants are a gap's length apart from a skipped local time: the one read
@@ -83,8 +86,8 @@ std::int64_t ZoneTimeline::Compose(std::int64_t civil_seconds) const {
 // change where daylight time is summer time (02:30 becomes 03:30 daylight time),
 // back where a zone writes its winter as daylight time (Europe/Dublin). When both
 // sides are alike, forward.
-std::int64_t ZoneTimeline::ChooseInGap(std::int64_t civil_seconds, const LocalType& before,
-                                       const LocalType& after) {
+std::int64_t ZoneTimeline::ChooseInGap(std::int64_t civil_seconds,
+                                       const LocalType& before, const LocalType& after) {
   const std::int64_t forward = civil_seconds - before.utc_offset;  // lands in `after`
   const std::int64_t back = civil_seconds - after.utc_offset;      // lands in `before`
   return before.is_dst && !after.is_dst ? back : forward;
@@ -96,8 +99,8 @@ std::int64_t ZoneTimeline::ComposeByProbing(std::int64_t civil_seconds) const {
   // after it, and at the instants they point to, cover every reading.
   std::int64_t offsets[6];
   std::size_t count = 0;
-  for (const std::int64_t probe : {civil_seconds - kSecondsPerDay, civil_seconds,
-                                   civil_seconds + kSecondsPerDay}) {
+  for (const std::int64_t probe :
+       {civil_seconds - kSecondsPerDay, civil_seconds, civil_seconds + kSecondsPerDay}) {
     const std::int64_t offset = OffsetAt(probe);
     offsets[count++] = offset;
     offsets[count++] = OffsetAt(civil_seconds - offset);

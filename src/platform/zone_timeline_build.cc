@@ -102,7 +102,8 @@ void ZoneTimeline::AddRulePeriods(std::int64_t from, std::int64_t to) {
 // transition on, the footer rule when there is one; a file without transitions
 // keeps its first standard type for ever, footer or not.
 void ZoneTimeline::BuildFromFile(const Tzif& file) {
-  for (const TzifType& type : file.types) AddType(type.utc_offset, type.is_dst, type.abbreviation);
+  for (const TzifType& type : file.types)
+    AddType(type.utc_offset, type.is_dst, type.abbreviation);
   std::uint16_t initial = 0;
   while (initial < file.types.size() && file.types[initial].is_dst) ++initial;
   if (initial == file.types.size()) initial = 0;
@@ -141,8 +142,10 @@ void ZoneTimeline::BuildFromRule(const PosixRule& rule) {
 // offsets), as the file's standard/UT indicators say, and keeps the file's
 // footer, unchanged, for the instants after them.
 void ZoneTimeline::BuildFromDefaultRules(const PosixRule& rule, const Tzif& file) {
-  const std::uint16_t standard = AddType(rule.std_seconds_east, false, rule.std_abbreviation);
-  const std::uint16_t daylight = AddType(rule.dst_seconds_east, true, rule.dst_abbreviation);
+  const std::uint16_t standard =
+      AddType(rule.std_seconds_east, false, rule.std_abbreviation);
+  const std::uint16_t daylight =
+      AddType(rule.dst_seconds_east, true, rule.dst_abbreviation);
 
   std::int32_t file_standard = file.types[0].utc_offset;
   std::int32_t file_daylight = file_standard;
@@ -220,7 +223,8 @@ ZoneTimeline ZoneTimeline::Build(const LoadedZone& zone,
       // TZ unset, empty or ":" reads as "UTC"; a rule string that does not parse
       // keeps the name it begins with.
       const bool named = tz && !tz->empty() && *tz != ":";
-      timeline.AddPeriod(INT64_MIN, timeline.AddType(0, false, named ? LeadingZoneName(*tz) : "UTC"));
+      timeline.AddPeriod(
+          INT64_MIN, timeline.AddType(0, false, named ? LeadingZoneName(*tz) : "UTC"));
       break;
     }
   }

@@ -1,10 +1,10 @@
 #include "support/glibc_agreement.h"
 
 #include <algorithm>
+#include <cstdio>
 #include <cstring>
 #include <ctime>
 #include <filesystem>
-#include <cstdio>
 #include <map>
 #include <sstream>
 #include <utility>
@@ -16,8 +16,8 @@
 namespace datetimelib::testing {
 namespace {
 
-constexpr std::int64_t kFirst = 0;                    // 1970-01-01 00:00:00 UTC
-constexpr std::int64_t kLast = 2147483647;            // 2038-01-19 03:14:07 UTC
+constexpr std::int64_t kFirst = 0;          // 1970-01-01 00:00:00 UTC
+constexpr std::int64_t kLast = 2147483647;  // 2038-01-19 03:14:07 UTC
 constexpr std::size_t kMismatchesKept = 8;
 
 std::tm Libc(std::int64_t t) {
@@ -31,11 +31,12 @@ std::string Describe(std::int64_t t, const std::tm& expected,
                      const platform::BrokenDownTime& got) {
   std::ostringstream out;
   out << "t=" << t << " glibc " << expected.tm_year + 1900 << "-" << expected.tm_mon + 1
-      << "-" << expected.tm_mday << " " << expected.tm_hour << ":" << expected.tm_min << ":"
-      << expected.tm_sec << " off=" << expected.tm_gmtoff << " dst=" << expected.tm_isdst
-      << " " << expected.tm_zone << " | ours " << got.year << "-" << got.month << "-"
-      << got.day << " " << got.hour << ":" << got.minute << ":" << got.second
-      << " off=" << got.utc_offset << " dst=" << got.is_dst << " " << got.abbreviation;
+      << "-" << expected.tm_mday << " " << expected.tm_hour << ":" << expected.tm_min
+      << ":" << expected.tm_sec << " off=" << expected.tm_gmtoff
+      << " dst=" << expected.tm_isdst << " " << expected.tm_zone << " | ours " << got.year
+      << "-" << got.month << "-" << got.day << " " << got.hour << ":" << got.minute << ":"
+      << got.second << " off=" << got.utc_offset << " dst=" << got.is_dst << " "
+      << got.abbreviation;
   return out.str();
 }
 
@@ -44,14 +45,16 @@ std::string ReadFile(const std::string& path) {
   if (std::FILE* file = std::fopen(path.c_str(), "rb")) {
     char chunk[4096];
     std::size_t count;
-    while ((count = std::fread(chunk, 1, sizeof chunk, file)) > 0) bytes.append(chunk, count);
+    while ((count = std::fread(chunk, 1, sizeof chunk, file)) > 0)
+      bytes.append(chunk, count);
     std::fclose(file);
   }
   return bytes;
 }
 
 void Note(AgreementReport* report, std::string what) {
-  if (report->mismatches.size() < kMismatchesKept) report->mismatches.push_back(std::move(what));
+  if (report->mismatches.size() < kMismatchesKept)
+    report->mismatches.push_back(std::move(what));
 }
 
 void CheckInstant(std::int64_t t, AgreementReport* report) {
@@ -74,7 +77,8 @@ std::int64_t Bisect(std::int64_t low, std::int64_t high) {
   while (high - low > 1) {
     const std::int64_t middle = low + (high - low) / 2;
     const std::tm at_middle = Libc(middle);
-    if (at_middle.tm_gmtoff == at_low.tm_gmtoff && at_middle.tm_isdst == at_low.tm_isdst &&
+    if (at_middle.tm_gmtoff == at_low.tm_gmtoff &&
+        at_middle.tm_isdst == at_low.tm_isdst &&
         std::strcmp(at_middle.tm_zone, at_low.tm_zone) == 0) {
       low = middle;
     } else {
@@ -86,7 +90,7 @@ std::int64_t Bisect(std::int64_t low, std::int64_t high) {
 
 // A change of glibc's clocks, found by bisection.
 struct Change {
-  std::int64_t at;          // first instant of the new time
+  std::int64_t at;             // first instant of the new time
   std::int64_t offset_before;  // seconds east
   std::int64_t offset_after;
 };
@@ -112,13 +116,15 @@ void CheckLocalHour(std::int64_t civil, const std::vector<Change>& changes,
                     std::size_t* next_change, AgreementReport* report) {
   while (*next_change < changes.size() &&
          changes[*next_change].at + std::max(changes[*next_change].offset_before,
-                                             changes[*next_change].offset_after) <= civil) {
+                                             changes[*next_change].offset_after) <=
+             civil) {
     ++*next_change;
   }
   const std::int64_t ours = platform::ComposeLocal(civil);
   for (std::size_t i = *next_change; i < changes.size() && i < *next_change + 2; ++i) {
     const Change& change = changes[i];
-    if (change.offset_before > change.offset_after && change.at + change.offset_after <= civil &&
+    if (change.offset_before > change.offset_after &&
+        change.at + change.offset_after <= civil &&
         civil < change.at + change.offset_before) {
       ++report->repeated_hours;
       if (ours != civil - change.offset_before) {
@@ -133,8 +139,8 @@ void CheckLocalHour(std::int64_t civil, const std::vector<Change>& changes,
   std::tm fields = MktimeFields(civil);
   const std::int64_t expected = mktime(&fields);
   if (ours != expected) {
-    Note(report, "local time " + std::to_string(civil) + ": ours " + std::to_string(ours) +
-                     ", mktime " + std::to_string(expected));
+    Note(report, "local time " + std::to_string(civil) + ": ours " +
+                     std::to_string(ours) + ", mktime " + std::to_string(expected));
   }
 }
 
@@ -149,8 +155,9 @@ AgreementReport CheckAgreementWithGlibc(const char* tz, int step_hours) {
   for (std::int64_t t = kFirst; t <= kLast; t += step) {
     CheckInstant(t, &report);
     const std::tm now = Libc(t);
-    if (t > kFirst && (now.tm_gmtoff != previous.tm_gmtoff || now.tm_isdst != previous.tm_isdst ||
-                       std::strcmp(now.tm_zone, previous.tm_zone) != 0)) {
+    if (t > kFirst &&
+        (now.tm_gmtoff != previous.tm_gmtoff || now.tm_isdst != previous.tm_isdst ||
+         std::strcmp(now.tm_zone, previous.tm_zone) != 0)) {
       const std::int64_t at = Bisect(t - step, t);
       ++report.transitions_found;
       for (const std::int64_t near : {at - 1, at, at + 1}) CheckInstant(near, &report);

@@ -45,7 +45,8 @@ int main(int argc, char** argv) {
   int failed = 0;
   for (std::size_t i = static_cast<std::size_t>(shard); i < zones.size();
        i += static_cast<std::size_t>(shards)) {
-    const auto report = datetimelib::testing::CheckAgreementWithGlibc(zones[i].c_str(), step_hours);
+    const auto report =
+        datetimelib::testing::CheckAgreementWithGlibc(zones[i].c_str(), step_hours);
     ++checked;
     instants += report.instants_checked;
     transitions += report.transitions_found;
@@ -58,8 +59,10 @@ int main(int argc, char** argv) {
     }
   }
   std::printf(
-      "zones %d (of %zu, shard %d/%d), disagreeing %d; breakdowns %lld, transitions %lld, "
+      "zones %d (of %zu, shard %d/%d), disagreeing %d; breakdowns %lld, transitions "
+      "%lld, "
       "compositions %lld, repeated local times %lld\n",
-      checked, zones.size(), shard, shards, failed, instants, transitions, hours, repeated);
+      checked, zones.size(), shard, shards, failed, instants, transitions, hours,
+      repeated);
   return failed == 0 ? 0 : 1;
 }
