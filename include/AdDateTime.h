@@ -240,6 +240,15 @@ class DATETIMELIB_API AdDateTime {
   // "2001-09-09 01:46:40".
   std::string FormatGMT(const char* pattern) const;
 
+  // Bulk forms of `Format`, `FormatGMT` and `FormatTolvane`: the same text, put
+  // into `out` in place of what it held. A caller that writes many values reuses
+  // one string's capacity instead of allocating each text (a 19- or 20-byte
+  // text does not fit in a std::string's inline buffer).
+  // Example: std::string line; for (...) { v.FormatInto(line, "%F %T"); ... }
+  void FormatInto(std::string& out, const char* pattern) const;
+  void FormatGMTInto(std::string& out, const char* pattern) const;
+  void FormatTolvaneInto(std::string& out) const;
+
   // Flag words of `Format(flags, locale)`: what of the value the locale writes.
   enum AdFormatFlags : std::uint32_t {
     dateAndTime = 0,  // the locale's date, a blank, its time of day: "%x %X"

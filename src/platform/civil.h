@@ -62,6 +62,44 @@ constexpr CivilDay CivilFromDays(std::int64_t days) {
   return CivilDay{year_of_era + era * 400 + (month <= 2 ? 1 : 0), month, day};
 }
 
+// The date and day of the year of a day, for days within +/-2^23 of 1970-01-01
+// (about 23 000 years either side), in 32-bit unsigned arithmetic: the
+// Euclidean affine forms of Neri and Schneider, a few multiplications and no
+// division by a variable. Agrees with CivilFromDays and YearDay on that range.
+struct CivilDayOfYear {
+  CivilDay date;
+  int yearday;  // [0:365], 0 == 1 January
+};
+inline constexpr std::int64_t kFastCivilLimit = std::int64_t{1} << 23;
+constexpr CivilDayOfYear FastCivilFromDays(std::int64_t days) {  // |days| < 2^23
+  // n below stays within [2^22, 2^25), so 4 * n + 3 fits in 32 bits.
+  // Shifted by 82 eras of 146 097 days so that every day counted is positive.
+  constexpr std::uint32_t kEraShift = 82;
+  constexpr std::uint32_t kDayShift = 719468 + 146097 * kEraShift;  // from 0000-03-01
+  const std::uint32_t n = static_cast<std::uint32_t>(days + kDayShift);
+  const std::uint32_t n1 = 4 * n + 3;
+  const std::uint32_t century = n1 / 146097;
+  const std::uint32_t day_of_century = n1 % 146097 / 4;
+  const std::uint32_t n2 = 4 * day_of_century + 3;
+  const std::uint64_t p2 = std::uint64_t{2939745} * n2;
+  const std::uint32_t year_of_century = static_cast<std::uint32_t>(p2 >> 32);
+  const std::uint32_t day_of_year =
+      static_cast<std::uint32_t>(p2) / 2939745 / 4;  // from 1 March
+  const std::uint32_t n3 = 2141 * day_of_year + 197913;
+  const std::uint32_t month = n3 >> 16;  // [3:14], March == 3
+  const std::uint32_t day = (n3 & 0xffff) / 2141;
+  const bool january_or_february = day_of_year >= 306;
+  const std::int64_t year = std::int64_t{100} * century + year_of_century -
+                            400 * std::int64_t{kEraShift} + (january_or_february ? 1 : 0);
+  const bool leap = year % 4 == 0 && (year % 100 != 0 || year % 400 == 0);
+  const int yearday = january_or_february
+                          ? static_cast<int>(day_of_year) - 306
+                          : static_cast<int>(day_of_year) + 59 + (leap ? 1 : 0);
+  return {{year, static_cast<int>(january_or_february ? month - 12 : month),
+           static_cast<int>(day) + 1},
+          yearday};
+}
+
 // 0 == Sunday ... 6 == Saturday. Day 0 (1970-01-01) was a Thursday.
 constexpr int WeekdayFromDays(std::int64_t days) {
   return static_cast<int>(FloorMod(days + 4, 7));
@@ -78,6 +116,14 @@ static_assert(DaysFromCivil(1969, 12, 31) == -1);
 static_assert(CivilFromDays(11016).month == 2 && CivilFromDays(11016).day == 29);
 static_assert(CivilFromDays(-1).year == 1969);
 static_assert(WeekdayFromDays(0) == 4 && WeekdayFromDays(-4) == 0);
+static_assert(FastCivilFromDays(11016).date.day == 29 &&
+              FastCivilFromDays(11016).yearday == 59);
+static_assert(FastCivilFromDays(-1).date.year == 1969 &&
+              FastCivilFromDays(-1).yearday == 364);
+static_assert(FastCivilFromDays(-kFastCivilLimit + 1).date.year ==
+              CivilFromDays(-kFastCivilLimit + 1).year);
+static_assert(FastCivilFromDays(kFastCivilLimit - 1).date.day ==
+              CivilFromDays(kFastCivilLimit - 1).day);
 
 // Seconds of local time counted as if the zone were UTC ("civil seconds") for
 // fields normalised the way mktime normalises them: seconds carry into minutes,

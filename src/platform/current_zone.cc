@@ -4,6 +4,7 @@
 #include <unistd.h>
 
 #include <cstring>
+#include <memory>
 #include <optional>
 #include <string>
 
@@ -13,8 +14,6 @@
 namespace datetimelib::platform {
 namespace {
 
-constexpr std::int64_t kFileCheckIntervalNanoseconds = 1000000000;
-
 struct ThreadZone {
   std::optional<ZoneTimeline> zone;
   std::optional<std::string> tz;  // TZ when `zone` was compiled; nothing when unset
@@ -22,10 +21,25 @@ struct ThreadZone {
   // unset), and its identity then; nothing when it was absent.
   std::string watched_path;
   std::optional<FileIdentity> watched_identity;
-  std::int64_t next_file_check = 0;  // CLOCK_MONOTONIC_COARSE nanoseconds
+  std::int64_t last_file_check = 0;  // wall-clock second of the last check
 };
 
-thread_local ThreadZone this_thread_zone;
+// The thread's state lives on the heap behind a pointer in initial-exec TLS: a
+// read is one %fs-relative load, where the general model calls __tls_get_addr on
+// every access. Eight bytes of static TLS are all it takes. The owner, in
+// general-model TLS, is touched only when the state is first made, and frees it
+// when the thread ends.
+__attribute__((tls_model("initial-exec"))) thread_local ThreadZone* this_thread_zone =
+    nullptr;
+thread_local std::unique_ptr<ThreadZone> this_thread_zone_owner;
+
+ThreadZone& ThisThreadZone() {
+  if (this_thread_zone == nullptr) {
+    this_thread_zone_owner = std::make_unique<ThreadZone>();
+    this_thread_zone = this_thread_zone_owner.get();
+  }
+  return *this_thread_zone;
+}
 
 // TZ's value, as getenv would find it, without getenv's general string search.
 const char* FindTz() {
@@ -39,16 +53,18 @@ const char* FindTz() {
 }
 
 bool SameTz(const std::optional<std::string>& compiled_for, const char* now) {
-  if (!compiled_for) return now == nullptr;
-  return now != nullptr && *compiled_for == now;
+  if (!compiled_for || now == nullptr) return !compiled_for && now == nullptr;
+  // strncmp stops at the end of `now`, so nothing beyond it is read.
+  const std::size_t length = compiled_for->size();
+  return std::strncmp(compiled_for->data(), now, length) == 0 && now[length] == '\0';
 }
 
+// True at most once per second of the wall clock. time() through the vDSO reads
+// one word; a clock that moves backwards only makes a check come early.
 bool FileCheckDue(ThreadZone* state) {
-  timespec now{};
-  clock_gettime(CLOCK_MONOTONIC_COARSE, &now);
-  const std::int64_t nanoseconds = std::int64_t{now.tv_sec} * 1000000000 + now.tv_nsec;
-  if (nanoseconds < state->next_file_check) return false;
-  state->next_file_check = nanoseconds + kFileCheckIntervalNanoseconds;
+  const std::int64_t now = static_cast<std::int64_t>(time(nullptr));
+  if (now == state->last_file_check) return false;
+  state->last_file_check = now;
   return true;
 }
 
@@ -65,13 +81,13 @@ void Compile(ThreadZone* state) {
   } else if (!settings.tz) {
     state->watched_path = settings.localtime_path;  // may appear later
   }
-  FileCheckDue(state);  // the next check is a second from now
+  FileCheckDue(state);  // no check again within this second
 }
 
 }  // namespace
 
 const ZoneTimeline& CurrentZone() {
-  ThreadZone& state = this_thread_zone;
+  ThreadZone& state = ThisThreadZone();
   if (!state.zone || !SameTz(state.tz, FindTz())) {
     Compile(&state);
   } else if (!state.watched_path.empty() && FileCheckDue(&state) &&

@@ -17,16 +17,23 @@ constexpr std::int64_t kSecondsPerDay = 86400;
 BrokenDownTime BreakDownUtc(std::int64_t unix_seconds) {
   const std::int64_t days = FloorDiv(unix_seconds, kSecondsPerDay);
   const int second_of_day = static_cast<int>(unix_seconds - days * kSecondsPerDay);
-  const CivilDay date = CivilFromDays(days);
+  CivilDayOfYear civil_day;
+  if (days > -kFastCivilLimit && days < kFastCivilLimit) {
+    civil_day = FastCivilFromDays(days);
+  } else {
+    civil_day.date = CivilFromDays(days);
+    civil_day.yearday =
+        YearDay(civil_day.date.year, civil_day.date.month, civil_day.date.day);
+  }
   BrokenDownTime out{};
-  out.year = static_cast<int>(date.year);
-  out.month = date.month;
-  out.day = date.day;
+  out.year = static_cast<int>(civil_day.date.year);
+  out.month = civil_day.date.month;
+  out.day = civil_day.date.day;
   out.hour = second_of_day / 3600;
   out.minute = second_of_day / 60 % 60;
   out.second = second_of_day % 60;
   out.weekday = WeekdayFromDays(days);
-  out.yearday = static_cast<int>(days - DaysFromCivil(date.year, 1, 1));
+  out.yearday = civil_day.yearday;
   std::memcpy(out.abbreviation, "GMT", 4);
   return out;
 }

@@ -70,9 +70,23 @@ class ZoneTimeline {
   std::vector<std::uint16_t> period_types_;  // index into types_
   // starts_[i] read in period i's own offset: where its local time begins.
   std::vector<std::int64_t> local_starts_;
+  // starts_[i + 1] read in period i's offset: where its local time ends (the
+  // largest int64 for the last period).
+  std::vector<std::int64_t> local_ends_;
   bool local_starts_ascend_ = true;  // else composition probes
 
   std::vector<LocalType> types_;
+
+  // Bucket indexes over the instants and local times of 32-bit counts (and a
+  // little beyond): bucket b holds the last period that begins at or before the
+  // bucket's first second, so a lookup is one read and a short forward scan
+  // instead of a binary search. Empty when a zone has too many periods.
+  static constexpr int kBucketShift = 21;  // buckets of 2^21 s, about 24 days
+  static constexpr std::int64_t kIndexFrom = std::int64_t{INT32_MIN} - 4 * 86400;
+  static constexpr std::int64_t kIndexTo = std::int64_t{INT32_MAX} + 4 * 86400;
+  std::vector<std::uint16_t> instant_index_;
+  std::vector<std::uint16_t> local_index_;
+  std::size_t LocalPeriodAt(std::int64_t civil_seconds) const;
 
   // Instants outside [table_from_, table_to_) are governed by `rule_` and
   // computed from it directly; the periods answer for the rest. Without a rule

@@ -196,12 +196,35 @@ void ZoneTimeline::BuildFromDefaultRules(const PosixRule& rule, const Tzif& file
   AddRulePeriods(last_transition, table_to_);
 }
 
+// Bucket b of the index holds the last of `starts` at or before the bucket's
+// first second.
+static std::vector<std::uint16_t> BucketIndex(const std::vector<std::int64_t>& starts,
+                                              int shift, std::int64_t from,
+                                              std::int64_t to) {
+  std::vector<std::uint16_t> index(static_cast<std::size_t>(((to - from) >> shift) + 1));
+  std::size_t period = 0;
+  for (std::size_t bucket = 0; bucket < index.size(); ++bucket) {
+    const std::int64_t first_second = from + (static_cast<std::int64_t>(bucket) << shift);
+    while (period + 1 < starts.size() && starts[period + 1] <= first_second) ++period;
+    index[bucket] = static_cast<std::uint16_t>(period);
+  }
+  return index;
+}
+
 void ZoneTimeline::Finish() {
   local_starts_.resize(starts_.size());
+  local_ends_.resize(starts_.size());
   for (std::size_t i = 0; i < starts_.size(); ++i) {
-    local_starts_[i] =
-        i == 0 ? INT64_MIN : starts_[i] + types_[period_types_[i]].utc_offset;
+    const std::int32_t offset = types_[period_types_[i]].utc_offset;
+    local_starts_[i] = i == 0 ? INT64_MIN : starts_[i] + offset;
+    local_ends_[i] = i + 1 == starts_.size() ? INT64_MAX : starts_[i + 1] + offset;
     if (i > 0 && local_starts_[i] <= local_starts_[i - 1]) local_starts_ascend_ = false;
+  }
+  if (starts_.size() < UINT16_MAX) {
+    instant_index_ = BucketIndex(starts_, kBucketShift, kIndexFrom, kIndexTo);
+    if (local_starts_ascend_) {
+      local_index_ = BucketIndex(local_starts_, kBucketShift, kIndexFrom, kIndexTo);
+    }
   }
 }
 

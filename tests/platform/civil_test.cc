@@ -74,3 +74,21 @@ TEST(Civil, ExtremeFieldsAreExactOrRefused) {
 }
 
 }  // namespace
+
+namespace {
+
+// The 32-bit form agrees with the general one wherever it is used.
+TEST(Civil, FastFormAgreesWithGeneral) {
+  using datetimelib::platform::FastCivilFromDays;
+  using datetimelib::platform::kFastCivilLimit;
+  for (std::int64_t days = -kFastCivilLimit + 1; days < kFastCivilLimit; days += 3) {
+    const auto fast = FastCivilFromDays(days);
+    const auto general = CivilFromDays(days);
+    ASSERT_EQ(fast.date.year, general.year) << days;
+    ASSERT_EQ(fast.date.month, general.month) << days;
+    ASSERT_EQ(fast.date.day, general.day) << days;
+    ASSERT_EQ(fast.yearday, YearDay(general.year, general.month, general.day)) << days;
+  }
+}
+
+}  // namespace
