@@ -497,6 +497,8 @@ class DATETIMELIB_API AdDateTime {
  private:
   // ----------------------------------------------------------------------------
 
+  void WriteNotValid(std::string& out) const;
+
   // The range test: 1 when the fields name a date that a value can hold.
   static int Valid_Range(long year, long month, long day, long hour, long minute,
                          long second);

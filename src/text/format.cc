@@ -3,9 +3,20 @@
 #include "platform/local_time.h"
 #include "text/strftime_text.h"
 
+// What the formatters give for a value that is not valid (and for a valid one
+// with a null pattern): the kept text of an outOfRange value, else nothing.
+// Copied and cleared in place, so that `out` keeps its capacity.
+void AdDateTime::WriteNotValid(std::string& out) const {
+  if (status_ == outOfRange) {
+    out.assign(kept_text_);
+  } else {
+    out.clear();
+  }
+}
+
 void AdDateTime::FormatInto(std::string& out, const char* pattern) const {
   if (status_ != valid || pattern == nullptr) {
-    out.assign(status_ == outOfRange ? kept_text_ : std::string());
+    WriteNotValid(out);
     return;
   }
   datetimelib::WritePattern(datetimelib::platform::BreakDownLocal(seconds_), pattern,
@@ -14,7 +25,7 @@ void AdDateTime::FormatInto(std::string& out, const char* pattern) const {
 
 void AdDateTime::FormatGMTInto(std::string& out, const char* pattern) const {
   if (status_ != valid || pattern == nullptr) {
-    out.assign(status_ == outOfRange ? kept_text_ : std::string());
+    WriteNotValid(out);
     return;
   }
   datetimelib::WritePattern(datetimelib::platform::BreakDownUtc(seconds_), pattern, &out);
