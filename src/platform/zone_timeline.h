@@ -51,7 +51,12 @@ class ZoneTimeline {
 
   const LocalType& TypeAt(std::int64_t unix_seconds) const;
   std::size_t PeriodAt(std::int64_t unix_seconds) const;
-  std::int64_t ComposeByProbing(std::int64_t civil_seconds) const;
+  std::int64_t ComposeByPieces(std::int64_t civil_seconds) const;
+  struct Piece {
+    std::int64_t start;  // first instant
+    const LocalType* type;
+  };
+  void PiecesBetween(std::int64_t from, std::int64_t to, std::vector<Piece>* out) const;
   static std::int64_t ChooseInGap(std::int64_t civil_seconds, const LocalType& before,
                                   const LocalType& after);
 
@@ -73,7 +78,10 @@ class ZoneTimeline {
   // starts_[i + 1] read in period i's offset: where its local time ends (the
   // largest int64 for the last period).
   std::vector<std::int64_t> local_ends_;
-  bool local_starts_ascend_ = true;  // else composition probes
+  bool local_starts_ascend_ = true;  // else composition walks the pieces
+  // The largest |offset| of any type, with a second to spare: every instant that
+  // reads as a local time L lies within this distance of L.
+  std::int64_t offset_span_ = 0;
 
   std::vector<LocalType> types_;
 

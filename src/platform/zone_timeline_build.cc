@@ -212,6 +212,12 @@ static std::vector<std::uint16_t> BucketIndex(const std::vector<std::int64_t>& s
 }
 
 void ZoneTimeline::Finish() {
+  offset_span_ = 1;
+  for (const LocalType& type : types_) {
+    offset_span_ = std::max(offset_span_, std::int64_t{type.utc_offset} < 0
+                                              ? 1 - std::int64_t{type.utc_offset}
+                                              : 1 + std::int64_t{type.utc_offset});
+  }
   local_starts_.resize(starts_.size());
   local_ends_.resize(starts_.size());
   for (std::size_t i = 0; i < starts_.size(); ++i) {
