@@ -238,10 +238,46 @@ class DATETIMELIB_API AdDateTime {
   // "2001-09-09 01:46:40".
   std::string FormatGMT(const char* pattern) const;
 
+  // Flag words of `Format(flags, locale)`: what of the value the locale writes.
+  enum AdFormatFlags : std::uint32_t {
+    dateAndTime = 0,  // the locale's date, a blank, its time of day: "%x %X"
+    timeOnly = 1,     // the locale's time of day: "%X"
+    dateOnly = 2,     // the locale's date: "%x"
+  };
+
+  // Locale identifiers with a meaning of their own. Any other number names a
+  // language and region: 1033 en_US, 2057 en_GB, 1031 de_DE, 1036 fr_FR, 1040
+  // it_IT, 3082 es_ES, 1043 nl_NL, 1046 pt_BR, 1049 ru_RU, 1041 ja_JP, 2052
+  // zh_CN, 1042 ko_KR, and some forty more.
+  enum AdLocale : std::uint32_t {
+    invariantLocale = 127,       // "C"
+    userDefaultLocale = 1024,    // named by LC_ALL, else LC_TIME, else LANG
+    systemDefaultLocale = 2048,  // the process-wide locale that setlocale set
+  };
+
+  // The value in local time as a locale writes it (strftime's %x and %X of that
+  // locale, in its encoding). Bits other than `timeOnly` and `dateOnly` are
+  // ignored; both together write the date and the time.
+  // An unknown identifier, or a locale that is not installed, writes as "C".
+  // Example: 2003-05-17 14:03:09 gives "05/17/2003 02:03:09 PM" in 1033,
+  // "17.05.2003" with `dateOnly` in 1031, and "14:03:09" with `timeOnly` in 127.
+  // Note: `ParseDateTime` reads this text back on a thread whose locale is the
+  // one that wrote it; other locales may read it differently or not at all.
+  std::string Format(std::uint32_t flags, std::uint32_t locale) const;
+
   // --- Parsing ---------------------------------------------------------------------
   //
   // Both members read the whole text (trailing blanks aside) in the calling
   // thread's locale; every locale reads the canonical text "%Y-%m-%d %H:%M:%S".
+  // Every locale also reads: that text with "T" for the blank; a date alone (at
+  // 00:00:00); a time of day alone ("14:30", "14:30:00", "2:30 PM" where the
+  // locale has AM/PM words; on 1970-01-01 by the field constructor's rule);
+  // the locale's own date, time and date-time forms, so that what
+  // `Format(flags, locale)` writes reads back in that locale; and dates with the
+  // locale's month names, full or short, in any case ("17 MÄRZ 2003", "May 17,
+  // 2003"). A two-digit year is read only where the locale writes one: 69..99
+  // are 1969..1999, 00..68 are 2000..2068. Impossible fields (30 February, hour
+  // 24, second 60) make the text unreadable.
   // A text the thread's locale refuses whose 20th byte is "." (the canonical text
   // with a fraction of a second) is read once more, cut to its first 19 bytes, in
   // the user's default locale: "2003-05-17 14:03:09.250" reads as 14:03:09.

@@ -46,6 +46,7 @@ TEST(ParseDateTimeGMT, Outcomes) {
       {"2038-01-19 00:00:00", {0, AdDateTime::outOfRange, 777, "2038-01-19 00:00:00"}},
       {"1969-12-31 23:59:59", {0, AdDateTime::outOfRange, 777, "1969-12-31 23:59:59"}},
       {"1899-12-30 18:00:00", {0, AdDateTime::outOfRange, 777, "1899-12-30 18:00:00"}},
+      {"14:30:00", {0, AdDateTime::outOfRange, 777, "14:30:00"}},  // a time alone
       // Unreadable.
       {"", {0, AdDateTime::invalid, 777, ""}},
       {"not a date", {0, AdDateTime::invalid, 777, ""}},
@@ -57,7 +58,9 @@ TEST(ParseDateTimeGMT, Outcomes) {
       {"2003-01-01 24:00:00", {0, AdDateTime::invalid, 777, ""}},
       {"2003-01-01 23:60:00", {0, AdDateTime::invalid, 777, ""}},
       {"2003-01-01 23:59:60", {0, AdDateTime::invalid, 777, ""}},
-      {"2003-01-01 23:59", {0, AdDateTime::invalid, 777, ""}},
+      {"2003-01-01 23", {0, AdDateTime::invalid, 777, ""}},
+      // Every locale reads a time without seconds.
+      {"2003-01-01 23:59", {1, AdDateTime::valid, 1041465540, ""}},
       {" 2003-01-01 23:59:59", {0, AdDateTime::invalid, 777, ""}},
       {"2003-01-01 23:59:59.", {1, AdDateTime::valid, 1041465599, ""}},
   };
@@ -100,6 +103,7 @@ TEST(ParseDateTime, Outcomes) {
       {"1970-01-01 00:00:00", {1, AdDateTime::valid, 5 * 3600, ""}},
       // 1899-12-30 is the date of a time of day read alone: 1970-01-01.
       {"1899-12-30 18:00:00", {1, AdDateTime::valid, 23 * 3600, ""}},
+      {"1899-12-30 14:30:00", {1, AdDateTime::valid, 19 * 3600 + 1800, ""}},
       // The count of a refused local read is 0; the text is kept.
       {"1899-12-31 18:00:00", {0, AdDateTime::outOfRange, 0, "1899-12-31 18:00:00"}},
       {"2038-01-19 00:00:00", {0, AdDateTime::outOfRange, 0, "2038-01-19 00:00:00"}},
