@@ -92,7 +92,8 @@ TEST(AdtimeRead, ReadsLocalAndGmtTextAndKeepsTheStatusOfRefusedText) {
 TEST(AdtimeRead, ReadsInTheNamedLocale) {
   if (!TestLocalesCompiled()) GTEST_SKIP() << "test locales not compiled";
   RunOptions options;
-  options.extra_environment = {"LOCPATH=" ADTIME_TEST_LOCALE_DIR};
+  options.extra_environment = {"LOCPATH=" ADTIME_TEST_LOCALE_DIR,
+                               "LSAN_OPTIONS=suppressions=" ADTIME_LSAN_SUPPRESSIONS};
   ExpectOutputs({{{"read", "--locale", "de_DE.UTF-8", "--output", "tsv", "17.05.2003"},
                   "17.05.2003\tvalid\t1053144000\t2003-05-17 00:00:00\t"
                   "2003-05-17 04:00:00\t17-May-2003.00:00:00\n",

@@ -50,11 +50,21 @@ bool StartsWith(const char* text, const char* prefix) {
   return std::strncmp(text, prefix, std::strlen(prefix)) == 0;
 }
 
+// Whether `entry` ("NAME=value") sets one of the variables that `settings` set.
+bool SetByAny(const char* entry, const std::vector<std::string>& settings) {
+  for (const std::string& setting : settings) {
+    const std::string name = setting.substr(0, setting.find('=') + 1);
+    if (StartsWith(entry, name.c_str())) return true;
+  }
+  return false;
+}
+
 std::vector<std::string> ChildEnvironment(const RunOptions& options) {
   std::vector<std::string> environment;
   for (char** entry = environ; *entry != nullptr; ++entry) {
     if (StartsWith(*entry, "TZ=") || StartsWith(*entry, "LANG=") ||
-        StartsWith(*entry, "LC_") || StartsWith(*entry, "LOCPATH=")) {
+        StartsWith(*entry, "LC_") || StartsWith(*entry, "LOCPATH=") ||
+        SetByAny(*entry, options.extra_environment)) {
       continue;
     }
     environment.emplace_back(*entry);
