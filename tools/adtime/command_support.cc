@@ -17,17 +17,19 @@ int PrintHelp(const char* help) {
   return 0;
 }
 
+int FinishOutput(OutputBuffer* out, int status) {
+  if (out->Flush()) return status;
+  std::fputs("adtime: cannot write to standard output\n", stderr);
+  return kExitIoError;
+}
+
 int WriteRecords(const std::vector<Record>& records, OutputFormat format, int status) {
   OutputBuffer out(stdout);
   for (const Record& record : records) {
     WriteRecord(record, format, out.text());
     out.LineDone();
   }
-  if (!out.Flush()) {
-    std::fputs("adtime: cannot write to standard output\n", stderr);
-    return kExitIoError;
-  }
-  return status;
+  return FinishOutput(&out, status);
 }
 
 std::string StatusName(int status) {

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "command_line.h"
+#include "output_buffer.h"
 #include "record_writer.h"
 
 namespace adtime {
@@ -38,6 +39,10 @@ OutputFormat OutputFormatOf(const CommandLine& command_line);
 // Writes `help` to standard output; returns exit status 0 for the caller to
 // return.
 int PrintHelp(const char* help);
+
+// Flushes `out`. Returns `status`, or kExitIoError with a message when the
+// output could not be written.
+int FinishOutput(OutputBuffer* out, int status);
 
 // Writes the records (one line each) to standard output. Returns `status`, or
 // kExitIoError with a message when the output could not be written.

@@ -172,15 +172,12 @@ int RunConversions(const Args& args, const char* help, bool is_read) {
     WriteRecord(record, format, out.text());
     out.LineDone();
   }
-  if (!out.Flush()) {
-    std::fputs("adtime: cannot write to standard output\n", stderr);
-    return kExitIoError;
-  }
+  const int status = FinishOutput(&out, all_valid ? 0 : 1);
   if (read_failed) {
     std::fputs("adtime: cannot read standard input\n", stderr);
     return kExitIoError;
   }
-  return all_valid ? 0 : 1;
+  return status;
 }
 
 }  // namespace

@@ -44,9 +44,7 @@ int WriteResult(OutputFormat format, std::int32_t seconds, const char* name,
     OutputBuffer out(stdout);
     out.text()->append(text);
     out.LineDone();
-    if (out.Flush()) return 0;
-    std::fputs("adtime: cannot write to standard output\n", stderr);
-    return kExitIoError;
+    return FinishOutput(&out, 0);
   }
   std::vector<Record> records(1);
   records[0].AddNumber("seconds", seconds);
