@@ -403,6 +403,86 @@ class DATETIMELIB_API AdDateTime {
   AdDateTime GetWeekStartDate() const;
   AdDateTime GetWeekEndDate() const;
 
+  // --- Time zone and daylight saving ------------------------------------------
+  //
+  // Questions about the process's time zone, read afresh at every call: a `TZ`
+  // changed with setenv between two calls is seen by the second. The zone is the
+  // one the C library uses (`TZ` as a zone name under `TZDIR` or
+  // /usr/share/zoneinfo, or as a POSIX rule string; `/etc/localtime` when `TZ` is
+  // unset). Its rule is the one in force today (for a zone file, the rule string
+  // at the end of its data), applied to every year asked about: a zone that
+  // changed its rule in 2007 gets the new rule for 2006 too.
+
+  // The offset of the zone's standard time from GMT in minutes, truncated toward
+  // zero, positive WEST of Greenwich. Daylight saving never enters, so the
+  // result is the same in summer and in winter.
+  // Example: 300.0 in New York (UTC-5), -60.0 in Berlin (UTC+1), -330.0 in
+  // Kolkata (UTC+5:30), 205.0 for a standard time 12 345 s behind UTC.
+  // Note: the sign is the opposite of "UTC+1". Europe/Dublin gives -60.0: its
+  // rule takes Irish summer time as standard time and winter as the daylight part.
+  static double GetGMTOffset();
+
+  // 1 when the zone's current rule has daylight saving, else 0, whatever the
+  // season. Zones that had it in the past only give 0 (Asia/Tokyo, Asia/Kolkata,
+  // Europe/Moscow, America/Sao_Paulo).
+  static int UsesDST();
+
+  // The local date-times at which daylight saving starts and ends in `year` under
+  // the zone's current rule, in the canonical pattern "%Y-%m-%d %H:%M:%S":
+  //
+  //   start  the last second before the change to daylight time: the rule's
+  //          local time of the change minus one second;
+  //   end    the local time of the change back, as the clock reads it just
+  //          before the change.
+  //
+  // The days are the rule's own: its weekday in its week of the month (the
+  // second Sunday of March, the last Sunday of October), or a day of the year.
+  // A time of the change outside 00:00-24:00 carries into the neighbouring day.
+  // Both days lie in `year`, so south of the equator the end comes first.
+  //
+  // Returns 1 always. In a zone without daylight saving both texts are emptied.
+  // Where a date lies outside 1970-01-01..2038-01-18, its text is the one an
+  // `outOfRange` value keeps for those fields ("2039/3/13 1:59:59").
+  //
+  // Example: New York (",M3.2.0,M11.1.0", changes at 02:00), 2007: start
+  // "2007-03-11 01:59:59", end "2007-11-04 02:00:00". Sydney, 2010: start
+  // "2010-10-03 01:59:59", end "2010-04-04 03:00:00".
+  // Note: Europe/Dublin follows its rule as written, winter being the daylight
+  // part: for 2008 the start is "2008-10-26 01:59:59" and the end, earlier in the
+  // same year, "2008-03-30 01:00:00".
+  static int GenerateDSTDates(int year, std::string& start, std::string& end);
+
+  // The start and end of daylight saving in `year`, from the table file
+  // `directory` + "/dst_dates.dat" when it has an entry for the year, else as
+  // GenerateDSTDates computes them. The result does not say which.
+  //
+  // Returns 0 with both texts emptied when the zone's current rule has no
+  // daylight saving (no table is then read), else 1 with both texts written.
+  //
+  // The table is read afresh at every call, line by line, for example:
+  //
+  //   # Daylight saving as our region decided it
+  //   2003-04-06 01:59:59;2003-10-26 02:00:00
+  //   2004-04-04 01:59:59;2004-10-31 02:00:00
+  //
+  // * A line ends at "\n", and a "\r" before it is dropped; the last line needs
+  //   no line end.
+  // * A line whose very first character is "#" is a comment (" #" is not).
+  // * Every other line is an entry: the start text before its first ";", the
+  //   end text after it. Neither is trimmed. Each is read with ParseDateTime and
+  //   must give a valid value; a line that does not is passed over, as is a line
+  //   without ";" or starting with it.
+  // * An entry belongs to the local year of its start; its end may lie later.
+  //   The first entry of the year in file order is taken.
+  // * The texts handed back are the two values written in the canonical pattern
+  //   in local time, whatever form the entry used.
+  // * No table: a null `directory`, no such file, or a name that is not a
+  //   regular file (a directory, a FIFO or a device is never read, so a call
+  //   never waits). Lines longer than 4096 bytes or holding a NUL byte are
+  //   passed over like unreadable ones.
+  static int GetDSTDates(const char* directory, int year, std::string& start,
+                         std::string& end);
+
  private:
   // ----------------------------------------------------------------------------
 

@@ -2,7 +2,11 @@
 // escaping of hostile input, run against the built tool.
 #include <gtest/gtest.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
+#include <cstdio>
+#include <cstdlib>
+#include <fstream>
 #include <string>
 #include <vector>
 
@@ -147,6 +151,68 @@ TEST(AdtimeWeek, GivesTheWeekAroundADateAndOutOfRangeAtTheEnds) {
   });
 }
 
+// --- Time zone ------------------------------------------------------------------------
+
+TEST(AdtimeZone, ReportsTheZoneOfTz) {
+  const struct {
+    const char* tz;
+    const char* fields;  // what the JSON line holds before "year"
+    bool has_dst;
+  } cases[] = {
+      {"EST5EDT,M3.2.0,M11.1.0",
+       R"({"zone":"EST5EDT,M3.2.0,M11.1.0","offset_minutes":300,"uses_dst":1,)", true},
+      {"<+0530>-5:30", R"({"zone":"<+0530>-5:30","offset_minutes":-330,"uses_dst":0,)",
+       false},
+      {"Asia/Tokyo", R"({"zone":"Asia/Tokyo","offset_minutes":-540,"uses_dst":0,)",
+       false},
+  };
+  for (const auto& row : cases) {
+    SCOPED_TRACE(row.tz);
+    RunOptions options;
+    options.tz = row.tz;
+    const RunResult result = RunAdtime({"zone", "--output", "json"}, options);
+    EXPECT_EQ(result.exit_status, 0);
+    EXPECT_EQ(result.out.rfind(row.fields, 0), 0u) << result.out;
+    EXPECT_EQ(result.out.find(R"("dst_start":null)") == std::string::npos, row.has_dst)
+        << result.out;
+  }
+}
+
+TEST(AdtimeDst, GivesTheDatesOfEachYearFromTheRuleOrTheTable) {
+  ExpectOutputs({
+      {{"dst", "2007", "2008"},
+       "year=2007 status=valid start=\"2007-03-11 01:59:59\" end=\"2007-11-04 "
+       "02:00:00\"\n"
+       "year=2008 status=valid start=\"2008-03-09 01:59:59\" end=\"2008-11-02 "
+       "02:00:00\"\n",
+       0},
+      // The 2039 dates lie past 2038-01-18.
+      {{"dst", "2039", "--output", "tsv"},
+       "2039\toutOfRange\t2039/3/13 1:59:59\t2039/11/6 2:0:0\n",
+       1},
+  });
+  RunOptions tokyo;
+  tokyo.tz = "Asia/Tokyo";
+  ExpectOutputs({{{"dst", "2007"}, "year=2007 status=none\n", 0}}, tokyo);
+}
+
+TEST(AdtimeDst, ATableEntryComesBeforeTheRule) {
+  char dir_template[] = "/tmp/adtime_table_XXXXXX";
+  ASSERT_NE(mkdtemp(dir_template), nullptr);
+  const std::string dir = dir_template;
+  const std::string table = dir + "/dst_dates.dat";
+  {
+    std::ofstream out(table);
+    out << "# our own dates\n2004-04-11 01:59:59;2004-10-24 02:00:00\n";
+  }
+  ExpectOutputs({{{"dst", "--table", dir, "2004", "2005", "--output", "tsv"},
+                  "2004\tvalid\t2004-04-11 01:59:59\t2004-10-24 02:00:00\n"
+                  "2005\tvalid\t2005-03-13 01:59:59\t2005-11-06 02:00:00\n",
+                  0}});
+  std::remove(table.c_str());
+  rmdir(dir.c_str());
+}
+
 TEST(AdtimeUsage, RefusesBadCommandLinesWithStatusTwoAndAReason) {
   const struct {
     Args args;
@@ -173,6 +239,10 @@ TEST(AdtimeUsage, RefusesBadCommandLinesWithStatusTwoAndAReason) {
       {{"week", "2003", "6"}, "YEAR MONTH DAY"},
       {{"week", "2003", "June", "1"}, "MONTH must be a whole number"},
       {{"week", "99999999999", "1", "1"}, "outside"},
+      {{"zone", "now"}, "no arguments"},
+      {{"dst"}, "at least one YEAR"},
+      {{"dst", "2007", "next"}, "YEAR must be a whole number"},
+      {{"dst", "--table"}, "needs a value"},
   };
   for (const auto& row : cases) {
     std::string command;
@@ -186,7 +256,8 @@ TEST(AdtimeUsage, RefusesBadCommandLinesWithStatusTwoAndAReason) {
 }
 
 TEST(AdtimeUsage, EveryCommandHasHelp) {
-  for (const char* command : {"parse", "read", "format", "compact", "week"}) {
+  for (const char* command :
+       {"parse", "read", "format", "compact", "week", "zone", "dst"}) {
     SCOPED_TRACE(command);
     const RunResult result = RunAdtime({command, "--help"});
     EXPECT_EQ(result.exit_status, 0);

@@ -42,7 +42,8 @@ struct Command {
 constexpr Command kCommands[] = {
     {"parse", adtime::RunParse},   {"read", adtime::RunRead},
     {"format", adtime::RunFormat}, {"compact", adtime::RunCompact},
-    {"week", adtime::RunWeek},
+    {"week", adtime::RunWeek},     {"zone", adtime::RunZone},
+    {"dst", adtime::RunDst},
 };
 
 int Usage(const std::string& reason) {

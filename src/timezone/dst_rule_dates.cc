@@ -1,0 +1,56 @@
+// Daylight-saving dates computed from the zone's current rule.
+#include "AdDateTime.h"
+#include "platform/civil.h"
+#include "platform/local_time.h"
+#include "platform/zone_source.h"
+#include "text/canonical_text.h"
+#include "text/strftime_text.h"
+#include "timezone/rule_dates.h"
+
+namespace datetimelib {
+namespace {
+
+constexpr std::int64_t kSecondsPerDay = 86400;
+
+// The text of a transition's local date-time moved by `shift_seconds`.
+//
+// The text is written from the rule's own local fields, not from a value
+// composed from them: the end of a rule with negative daylight saving (Dublin's
+// 01:00 GMT in March) is a local time that the clocks skip, and composing it
+// would move it to 02:00. Fields outside the range give the text that an
+// outOfRange value keeps for them.
+std::string TransitionText(const platform::TransitionRule& transition, int year,
+                           std::int32_t shift_seconds) {
+  // |civil| < 2^47 for every int year: 2^31 years of 2^25 seconds.
+  const std::int64_t civil =
+      platform::TransitionInYear(transition, year).CivilSeconds() + shift_seconds;
+  const std::int64_t days = platform::FloorDiv(civil, kSecondsPerDay);
+  const std::int64_t second_of_day = civil - days * kSecondsPerDay;  // [0, 86399]
+  const platform::CivilDay date = platform::CivilFromDays(days);
+  const AdDateTime value(date.year, date.month, date.day, second_of_day / 3600,
+                         second_of_day / 60 % 60, second_of_day % 60);
+  if (!value.IsValid()) return value.Format(kCanonicalPattern);
+  return StrftimeText(platform::BreakDownUtc(civil), kCanonicalPattern);
+}
+
+}  // namespace
+
+void WriteRuleDates(const platform::PosixRule& rule, int year, std::string* start,
+                    std::string* end) {
+  if (rule.dst != platform::PosixRule::Dst::kWithRules) {
+    start->clear();
+    end->clear();
+    return;
+  }
+  *start = TransitionText(rule.start, year, -1);
+  *end = TransitionText(rule.end, year, 0);
+}
+
+}  // namespace datetimelib
+
+int AdDateTime::GenerateDSTDates(int year, std::string& start, std::string& end) {
+  datetimelib::WriteRuleDates(
+      datetimelib::platform::CurrentRule(datetimelib::platform::LoadProcessZone()), year,
+      &start, &end);
+  return 1;
+}

@@ -1,0 +1,63 @@
+// A fresh directory under $TMPDIR (or /tmp), removed with everything in it when
+// the guard ends.
+#ifndef DATETIMELIB_TESTS_SUPPORT_TEMP_DIR_H_
+#define DATETIMELIB_TESTS_SUPPORT_TEMP_DIR_H_
+
+#include <stdlib.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <filesystem>
+#include <string>
+
+namespace datetimelib::testing {
+
+class TempDir {
+ public:
+  TempDir() {
+    const char* base = std::getenv("TMPDIR");
+    std::string pattern = std::string(base && *base ? base : "/tmp") + "/dtl-XXXXXX";
+    if (mkdtemp(pattern.data()) != nullptr) path_ = pattern;
+  }
+  ~TempDir() {
+    std::error_code ignored;
+    if (!path_.empty()) std::filesystem::remove_all(path_, ignored);
+  }
+  TempDir(const TempDir&) = delete;
+  TempDir& operator=(const TempDir&) = delete;
+
+  bool ok() const { return !path_.empty(); }
+  const std::string& path() const { return path_; }
+  std::string Path(const std::string& name) const { return path_ + "/" + name; }
+
+  // Writes `content` to `name` (subfolders created), replacing any file there.
+  std::string Write(const std::string& name, const std::string& content) const {
+    const std::string file = Path(name);
+    std::filesystem::create_directories(std::filesystem::path(file).parent_path());
+    if (std::FILE* out = std::fopen(file.c_str(), "wb")) {
+      std::fwrite(content.data(), 1, content.size(), out);
+      std::fclose(out);
+    }
+    return file;
+  }
+
+ private:
+  std::string path_;
+};
+
+// The bytes of a file, or "" when it cannot be read.
+inline std::string ReadFileBytes(const std::string& path) {
+  std::string bytes;
+  if (std::FILE* file = std::fopen(path.c_str(), "rb")) {
+    char chunk[4096];
+    std::size_t count = 0;
+    while ((count = std::fread(chunk, 1, sizeof chunk, file)) > 0)
+      bytes.append(chunk, count);
+    std::fclose(file);
+  }
+  return bytes;
+}
+
+}  // namespace datetimelib::testing
+
+#endif  // DATETIMELIB_TESTS_SUPPORT_TEMP_DIR_H_
