@@ -9,6 +9,7 @@
 #include <string>
 
 #include "platform/regular_file.h"
+#include "platform/tz_watch.h"
 #include "platform/zone_source.h"
 
 namespace datetimelib::platform {
@@ -17,6 +18,7 @@ namespace {
 struct ThreadZone {
   std::optional<ZoneTimeline> zone;
   std::optional<std::string> tz;  // TZ when `zone` was compiled; nothing when unset
+  TzWatch tz_watch;
   // The file the zone came from, or would come from (/etc/localtime when TZ is
   // unset), and its identity then; nothing when it was absent.
   std::string watched_path;
@@ -39,24 +41,6 @@ ThreadZone& ThisThreadZone() {
     this_thread_zone = this_thread_zone_owner.get();
   }
   return *this_thread_zone;
-}
-
-// TZ's value, as getenv would find it, without getenv's general string search.
-const char* FindTz() {
-  char** entries = environ;
-  if (entries == nullptr) return nullptr;
-  for (; *entries != nullptr; ++entries) {
-    const char* entry = *entries;
-    if (entry[0] == 'T' && entry[1] == 'Z' && entry[2] == '=') return entry + 3;
-  }
-  return nullptr;
-}
-
-bool SameTz(const std::optional<std::string>& compiled_for, const char* now) {
-  if (!compiled_for || now == nullptr) return !compiled_for && now == nullptr;
-  // strncmp stops at the end of `now`, so nothing beyond it is read.
-  const std::size_t length = compiled_for->size();
-  return std::strncmp(compiled_for->data(), now, length) == 0 && now[length] == '\0';
 }
 
 // True at most once per second of the wall clock. time() through the vDSO reads
@@ -88,8 +72,9 @@ void Compile(ThreadZone* state) {
 
 const ZoneTimeline& CurrentZone() {
   ThreadZone& state = ThisThreadZone();
-  if (!state.zone || !SameTz(state.tz, FindTz())) {
-    Compile(&state);
+  if (!state.tz_watch.Unchanged()) {
+    state.tz_watch.Refresh();
+    if (!state.zone || state.tz_watch.value() != state.tz) Compile(&state);
   } else if (!state.watched_path.empty() && FileCheckDue(&state) &&
              IdentityOf(state.watched_path) != state.watched_identity) {
     Compile(&state);

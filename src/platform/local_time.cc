@@ -8,32 +8,17 @@
 #include "platform/current_zone.h"
 
 namespace datetimelib::platform {
-namespace {
-
-constexpr std::int64_t kSecondsPerDay = 86400;
-
-}  // namespace
-
 BrokenDownTime BreakDownUtc(std::int64_t unix_seconds) {
-  const std::int64_t days = FloorDiv(unix_seconds, kSecondsPerDay);
-  const int second_of_day = static_cast<int>(unix_seconds - days * kSecondsPerDay);
-  CivilDayOfYear civil_day;
-  if (days > -kFastCivilLimit && days < kFastCivilLimit) {
-    civil_day = FastCivilFromDays(days);
-  } else {
-    civil_day.date = CivilFromDays(days);
-    civil_day.yearday =
-        YearDay(civil_day.date.year, civil_day.date.month, civil_day.date.day);
-  }
+  const CivilFields civil = CivilFieldsOf(unix_seconds);
   BrokenDownTime out{};
-  out.year = static_cast<int>(civil_day.date.year);
-  out.month = civil_day.date.month;
-  out.day = civil_day.date.day;
-  out.hour = second_of_day / 3600;
-  out.minute = second_of_day / 60 % 60;
-  out.second = second_of_day % 60;
-  out.weekday = WeekdayFromDays(days);
-  out.yearday = civil_day.yearday;
+  out.year = static_cast<int>(civil.date.year);
+  out.month = civil.date.month;
+  out.day = civil.date.day;
+  out.hour = civil.hour;
+  out.minute = civil.minute;
+  out.second = civil.second;
+  out.weekday = civil.weekday;
+  out.yearday = civil.yearday;
   std::memcpy(out.abbreviation, "GMT", 4);
   return out;
 }
