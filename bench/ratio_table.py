@@ -6,7 +6,7 @@ same run, their ratio (datetimelib / fastest peer) against the target, and the
 throughput of two threads over one for datetimelib and for the glibc baseline.
 
 Usage: ratio_table.py BENCHMARK_BINARY [--zones America/New_York,UTC]
-                      [--repetitions 5] [--min-time 0.3]
+                      [--repetitions 12] [--min-time 0.1]
 """
 import argparse
 import json
@@ -37,7 +37,10 @@ def run(binary, zone, repetitions, min_time):
     env = dict(os.environ, TZ=zone)
     out = subprocess.run(
         [binary, f"--benchmark_repetitions={repetitions}",
-         f"--benchmark_min_time={min_time}", "--benchmark_format=json"],
+         f"--benchmark_min_time={min_time}", "--benchmark_format=json",
+         # Repetitions of all benchmarks in random order, so that a slow spell
+         # of a shared machine falls on the library and its peers alike.
+         "--benchmark_enable_random_interleaving=true"],
         env=env, check=True, capture_output=True, text=True).stdout
     medians = {}   # (area, library, threads) -> (ns per item, items per second)
     samples = {}
@@ -93,8 +96,8 @@ def main():
     parser = argparse.ArgumentParser()
     parser.add_argument("binary")
     parser.add_argument("--zones", default="America/New_York,UTC")
-    parser.add_argument("--repetitions", type=int, default=5)
-    parser.add_argument("--min-time", default="0.3")
+    parser.add_argument("--repetitions", type=int, default=12)
+    parser.add_argument("--min-time", default="0.1")
     args = parser.parse_args()
     for zone in args.zones.split(","):
         print(table(zone, run(args.binary, zone, args.repetitions, args.min_time)))

@@ -75,7 +75,7 @@ void BM_Breakdown_Datetimelib(benchmark::State& state) {
   std::size_t i = static_cast<std::size_t>(state.thread_index()) * 1000;
   for (auto _ : state) {
     const AdDateTime value(AdTime(counts[At(i++)]));
-    benchmark::DoNotOptimize(value.GetHour());
+    benchmark::DoNotOptimize(value.GetDay());
   }
   state.SetItemsProcessed(state.iterations());
 }
@@ -88,7 +88,7 @@ void BM_Breakdown_LocaltimeR(benchmark::State& state) {
     const time_t t = counts[At(i++)];
     std::tm fields;
     benchmark::DoNotOptimize(localtime_r(&t, &fields));
-    benchmark::DoNotOptimize(fields.tm_hour);
+    benchmark::DoNotOptimize(fields.tm_mday);
   }
   state.SetItemsProcessed(state.iterations());
 }
@@ -102,7 +102,7 @@ void BM_Breakdown_Abseil(benchmark::State& state) {
   for (auto _ : state) {
     const absl::CivilSecond civil =
         absl::ToCivilSecond(absl::FromUnixSeconds(counts[At(i++)]), zone);
-    benchmark::DoNotOptimize(civil.hour());
+    benchmark::DoNotOptimize(civil.day());
   }
   state.SetItemsProcessed(state.iterations());
 }

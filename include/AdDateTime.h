@@ -138,11 +138,13 @@ class DATETIMELIB_API AdDateTime {
   //
   // Example: AdDateTime(2038, 1, 19, 0, 0, 0).Format(...) gives "2038/1/19 0:0:0".
   //
-  // Note: a local time that a change to daylight saving skips moves forward by
-  // the size of the change (02:30 on a spring-forward day gives 03:30 daylight
-  // time). A local time that occurs twice gives the first occurrence, the
-  // daylight reading in zones that move their clocks ahead in summer. Unlike
-  // `mktime`, the answer never depends on earlier calls.
+  // Note: a local time that a change skips lands on the daylight side of the
+  // change, as `mktime` puts it: forward by the size of the change where daylight
+  // time is summer time (02:30 on a spring-forward day gives 03:30 daylight
+  // time), back where a zone writes its winter as daylight time (Europe/Dublin:
+  // 01:30 on 2019-03-31 gives 00:30 GMT). A local time that occurs twice gives the
+  // first occurrence, the daylight reading in zones that move their clocks ahead
+  // in summer. Unlike `mktime`, the answer never depends on earlier calls.
   AdDateTime(long year, long month, long day, long hour, long minute, long second);
 
   AdDateTime(const AdDateTime& other) = default;
@@ -237,6 +239,15 @@ class DATETIMELIB_API AdDateTime {
   // Example: AdDateTime(AdTime(1000000000)).FormatGMT("%Y-%m-%d %H:%M:%S") gives
   // "2001-09-09 01:46:40".
   std::string FormatGMT(const char* pattern) const;
+
+  // Bulk forms of `Format`, `FormatGMT` and `FormatTolvane`: the same text, put
+  // into `out` in place of what it held. A caller that writes many values reuses
+  // one string's capacity instead of allocating each text (a 19- or 20-byte
+  // text does not fit in a std::string's inline buffer).
+  // Example: std::string line; for (...) { v.FormatInto(line, "%F %T"); ... }
+  void FormatInto(std::string& out, const char* pattern) const;
+  void FormatGMTInto(std::string& out, const char* pattern) const;
+  void FormatTolvaneInto(std::string& out) const;
 
   // Flag words of `Format(flags, locale)`: what of the value the locale writes.
   enum AdFormatFlags : std::uint32_t {
@@ -485,6 +496,8 @@ class DATETIMELIB_API AdDateTime {
 
  private:
   // ----------------------------------------------------------------------------
+
+  void WriteNotValid(std::string& out) const;
 
   // The range test: 1 when the fields name a date that a value can hold.
   static int Valid_Range(long year, long month, long day, long hour, long minute,

@@ -62,6 +62,64 @@ constexpr CivilDay CivilFromDays(std::int64_t days) {
   return CivilDay{year_of_era + era * 400 + (month <= 2 ? 1 : 0), month, day};
 }
 
+// Days within which the 32-bit forms below are exact (about 23 000 years either
+// side of 1970).
+inline constexpr std::int64_t kFastCivilLimit = std::int64_t{1} << 23;
+
+// Every field of a count of civil seconds, for counts within
+// +/-kFastCivilSecondsLimit (about 23 000 years either side of 1970), in unsigned
+// arithmetic with constant divisors only: the breakdown's hot path. Agrees with
+// CivilFromDays, YearDay and WeekdayFromDays on that range.
+struct CivilFields {
+  CivilDay date;
+  int hour;     // [0:23]
+  int minute;   // [0:59]
+  int second;   // [0:59]
+  int weekday;  // [0:6], 0 == Sunday
+  int yearday;  // [0:365], 0 == 1 January
+};
+inline constexpr std::int64_t kFastCivilSecondsLimit = kFastCivilLimit * 86400;
+constexpr CivilFields FastCivilFields(std::int64_t civil_seconds) {
+  constexpr std::uint32_t kEraShift = 82;  // 400-year eras that make every count positive
+  constexpr std::uint32_t kDayShift = 719468 + 146097 * kEraShift;  // day 0 is 0000-03-01
+  // Below 2^41 for every count in range.
+  const std::uint64_t shifted =
+      static_cast<std::uint64_t>(civil_seconds + std::int64_t{kDayShift} * 86400);
+  // n stays within [2^22, 2^25), so 4 * n + 3 fits in 32 bits.
+  const std::uint32_t n = static_cast<std::uint32_t>(shifted / 86400);
+  const std::uint32_t second_of_day = static_cast<std::uint32_t>(shifted % 86400);
+  const std::uint32_t n1 = 4 * n + 3;
+  const std::uint32_t century = n1 / 146097;
+  const std::uint32_t day_of_century = n1 % 146097 / 4;
+  const std::uint32_t n2 = 4 * day_of_century + 3;
+  const std::uint64_t p2 = std::uint64_t{2939745} * n2;
+  const std::uint32_t year_of_century = static_cast<std::uint32_t>(p2 >> 32);
+  const std::uint32_t day_of_year =
+      static_cast<std::uint32_t>(p2) / 2939745 / 4;  // from 1 March
+  const std::uint32_t n3 = 2141 * day_of_year + 197913;
+  const std::uint32_t month = n3 >> 16;  // [3:14], March == 3
+  const std::uint32_t day = (n3 & 0xffff) / 2141;
+  const bool january_or_february = day_of_year >= 306;
+  // The year of this March, leap or not: the shift is whole 400-year eras.
+  const bool leap =
+      year_of_century != 0 ? (year_of_century & 3) == 0 : (century & 3) == 0;
+  CivilFields out{};
+  out.date.year = std::int64_t{100} * century + year_of_century -
+                  400 * std::int64_t{kEraShift} + (january_or_february ? 1 : 0);
+  out.date.month = static_cast<int>(january_or_february ? month - 12 : month);
+  out.date.day = static_cast<int>(day) + 1;
+  out.hour = static_cast<int>(second_of_day / 3600);
+  out.minute = static_cast<int>(second_of_day / 60 % 60);
+  out.second = static_cast<int>(second_of_day % 60);
+  // Shifted day 0 was a Wednesday (3), so 1970-01-01, day kDayShift, is a Thursday.
+  out.weekday = static_cast<int>((n + 3) % 7);
+  // A January or February belongs to the year after this March's, whose leap day
+  // has not come yet.
+  out.yearday = january_or_february ? static_cast<int>(day_of_year) - 306
+                                    : static_cast<int>(day_of_year) + 59 + (leap ? 1 : 0);
+  return out;
+}
+
 // 0 == Sunday ... 6 == Saturday. Day 0 (1970-01-01) was a Thursday.
 constexpr int WeekdayFromDays(std::int64_t days) {
   return static_cast<int>(FloorMod(days + 4, 7));
@@ -72,12 +130,37 @@ constexpr int YearDay(std::int64_t year, int month, int day) {
   return static_cast<int>(DaysFromCivil(year, month, day) - DaysFromCivil(year, 1, 1));
 }
 
+// Every field of a count of civil seconds: the 32-bit forms within their range,
+// the general algorithms beyond it.
+constexpr CivilFields CivilFieldsOf(std::int64_t civil_seconds) {
+  if (civil_seconds > -kFastCivilSecondsLimit && civil_seconds < kFastCivilSecondsLimit) {
+    return FastCivilFields(civil_seconds);
+  }
+  const std::int64_t days = FloorDiv(civil_seconds, 86400);
+  const int second_of_day = static_cast<int>(civil_seconds - days * 86400);
+  CivilFields out{};
+  out.date = CivilFromDays(days);
+  out.hour = second_of_day / 3600;
+  out.minute = second_of_day / 60 % 60;
+  out.second = second_of_day % 60;
+  out.weekday = WeekdayFromDays(days);
+  out.yearday = YearDay(out.date.year, out.date.month, out.date.day);
+  return out;
+}
+
 static_assert(DaysFromCivil(1970, 1, 1) == 0);
 static_assert(DaysFromCivil(2000, 3, 1) == 11017);
 static_assert(DaysFromCivil(1969, 12, 31) == -1);
 static_assert(CivilFromDays(11016).month == 2 && CivilFromDays(11016).day == 29);
 static_assert(CivilFromDays(-1).year == 1969);
 static_assert(WeekdayFromDays(0) == 4 && WeekdayFromDays(-4) == 0);
+static_assert(FastCivilFields(-kFastCivilSecondsLimit + 1).date.year ==
+              CivilFromDays(-kFastCivilLimit).year);
+static_assert(FastCivilFields(kFastCivilSecondsLimit - 1).date.day ==
+              CivilFromDays(kFastCivilLimit - 1).day);
+static_assert(FastCivilFields(0).weekday == 4 && FastCivilFields(-1).hour == 23 &&
+              FastCivilFields(-1).yearday == 364 &&
+              FastCivilFields(951782400).yearday == 59);
 
 // Seconds of local time counted as if the zone were UTC ("civil seconds") for
 // fields normalised the way mktime normalises them: seconds carry into minutes,

@@ -2,7 +2,8 @@
 //
 // Every call follows the zone as the C library sees it at that moment (`TZ`, else
 // /etc/localtime): a `TZ` changed with setenv between two calls is seen by the
-// second, by composition and breakdown alike.
+// second, by composition and breakdown alike. The answers are those of glibc's
+// localtime_r, from our own compiled zone (zone_timeline.h), without its lock.
 //
 // Instants are 64-bit seconds since 1970-01-01 00:00:00 UTC ("unix seconds");
 // local fields are also carried as "civil seconds", the same count taken as if
@@ -37,11 +38,13 @@ BrokenDownTime BreakDownUtc(std::int64_t unix_seconds);
 
 // The instant of a local time given as civil seconds.
 //
-// A local time skipped by a forward change of the clocks is read with the offset
-// in force before the change, so it lands after the change by the size of the gap
-// (02:30 on a spring-forward day gives 03:30 daylight time). A local time that
-// occurs twice gives the earlier instant. The result never depends on earlier
-// calls.
+// A local time that a change skips lands on the side of the change that is
+// daylight time, as glibc's mktime chooses: forward by the size of the gap where
+// daylight time is summer time (02:30 on a spring-forward day gives 03:30
+// daylight time), back where a zone writes its winter as daylight time
+// (Europe/Dublin); forward when neither side is daylight time. A local time that
+// occurs twice gives the earlier instant, which mktime does not promise. The
+// result never depends on earlier calls.
 std::int64_t ComposeLocal(std::int64_t civil_seconds);
 
 // The fields as a std::tm for strftime-style formatting. `tm_zone` points into

@@ -12,7 +12,23 @@ namespace {
 
 bool IsRegular(const struct stat& status) { return S_ISREG(status.st_mode); }
 
+FileIdentity IdentityFromStatus(const struct stat& status) {
+  FileIdentity identity;
+  identity.device = status.st_dev;
+  identity.inode = status.st_ino;
+  identity.size = status.st_size;
+  identity.modified_seconds = status.st_mtim.tv_sec;
+  identity.modified_nanoseconds = status.st_mtim.tv_nsec;
+  return identity;
+}
+
 }  // namespace
+
+std::optional<FileIdentity> IdentityOf(const std::string& path) {
+  struct stat status {};
+  if (stat(path.c_str(), &status) != 0) return std::nullopt;
+  return IdentityFromStatus(status);
+}
 
 std::optional<RegularFile> RegularFile::Open(const std::string& path) {
   // The name is tested before opening, so that no device is ever opened (opening
@@ -27,7 +43,7 @@ std::optional<RegularFile> RegularFile::Open(const std::string& path) {
     close(descriptor);
     return std::nullopt;
   }
-  return RegularFile(descriptor);
+  return RegularFile(descriptor, IdentityFromStatus(status));
 }
 
 RegularFile::RegularFile(RegularFile&& other) noexcept
@@ -53,10 +69,11 @@ long RegularFile::Read(char* buffer, std::size_t size) {
   }
 }
 
-std::optional<std::string> ReadRegularFile(const std::string& path,
-                                           std::size_t max_bytes) {
+std::optional<std::string> ReadRegularFile(const std::string& path, std::size_t max_bytes,
+                                           FileIdentity* identity) {
   std::optional<RegularFile> file = RegularFile::Open(path);
   if (!file) return std::nullopt;
+  if (identity != nullptr) *identity = file->Identity();
   std::string content;
   char chunk[4096];
   for (;;) {

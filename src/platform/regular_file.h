@@ -12,6 +12,26 @@
 
 namespace datetimelib::platform {
 
+// What tells one version of a file from another: a file replaced (renamed over,
+// rewritten) differs in one of these.
+struct FileIdentity {
+  unsigned long long device = 0;
+  unsigned long long inode = 0;
+  long long size = 0;
+  long long modified_seconds = 0;
+  long modified_nanoseconds = 0;
+
+  bool operator==(const FileIdentity& other) const {
+    return device == other.device && inode == other.inode && size == other.size &&
+           modified_seconds == other.modified_seconds &&
+           modified_nanoseconds == other.modified_nanoseconds;
+  }
+  bool operator!=(const FileIdentity& other) const { return !(*this == other); }
+};
+
+// The identity of what `path` names now (symbolic links followed), if anything.
+std::optional<FileIdentity> IdentityOf(const std::string& path);
+
 class RegularFile {
  public:
   // `path` opened for reading, if it names a regular file that can be opened.
@@ -27,16 +47,22 @@ class RegularFile {
   // file, -1 on a read error.
   long Read(char* buffer, std::size_t size);
 
+  // The identity of the file opened, taken from the open descriptor.
+  const FileIdentity& Identity() const { return identity_; }
+
  private:
-  explicit RegularFile(int descriptor) : descriptor_(descriptor) {}
+  RegularFile(int descriptor, const FileIdentity& identity)
+      : descriptor_(descriptor), identity_(identity) {}
 
   int descriptor_ = -1;  // -1 once moved from
+  FileIdentity identity_;
 };
 
 // The whole content of `path`, if it is a regular file of at most `max_bytes`
-// bytes that reads without error.
-std::optional<std::string> ReadRegularFile(const std::string& path,
-                                           std::size_t max_bytes);
+// bytes that reads without error; `identity`, when given, receives the identity
+// of the very file read.
+std::optional<std::string> ReadRegularFile(const std::string& path, std::size_t max_bytes,
+                                           FileIdentity* identity = nullptr);
 
 }  // namespace datetimelib::platform
 

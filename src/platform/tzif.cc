@@ -122,7 +122,7 @@ bool Designation(std::string_view chars, std::uint8_t index, std::string* out) {
 }
 
 // block = transition times, their types, type records, designations, leap-second
-// records, standard/wall and UT/local indicators (the last three skipped).
+// records (skipped), standard/wall and UT/local indicators.
 bool ReadBlock(ByteReader* reader, const Counts& counts, std::size_t time_width,
                Tzif* out) {
   if (!CountsAreConsistent(counts) ||
@@ -163,8 +163,18 @@ bool ReadBlock(ByteReader* reader, const Counts& counts, std::size_t time_width,
       return false;
     }
   }
-  return reader->Skip(std::uint64_t{counts.leap} * (time_width + 4) + counts.isstd +
-                      counts.isut);
+  if (!reader->Skip(std::uint64_t{counts.leap} * (time_width + 4))) return false;
+  for (std::uint32_t i = 0; i < counts.isstd; ++i) {
+    std::uint8_t flag = 0;
+    if (!reader->Byte(&flag)) return false;
+    out->types[i].is_standard = flag != 0;
+  }
+  for (std::uint32_t i = 0; i < counts.isut; ++i) {
+    std::uint8_t flag = 0;
+    if (!reader->Byte(&flag)) return false;
+    out->types[i].is_ut = flag != 0;
+  }
+  return true;
 }
 
 // footer = "\n" rule "\n", the rule holding no newline

@@ -26,6 +26,11 @@ struct TzifType {
   std::int32_t utc_offset;  // seconds east of UTC, never -2^31
   bool is_dst;
   std::string abbreviation;  // "EST", "+0530"; may be empty
+  // How the rules the file was made from wrote the times of transitions to this
+  // type (false where the file leaves them out). Only a "posixrules" file, whose
+  // transitions are moved to other offsets, needs them.
+  bool is_standard = false;  // in standard time rather than wall-clock time
+  bool is_ut = false;        // in UT rather than local time
 };
 
 struct Tzif {

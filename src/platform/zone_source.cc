@@ -20,8 +20,10 @@ TransitionRule SundayRule(int month, int week) {  // at the default 02:00
   return rule;
 }
 
-std::optional<Tzif> ReadZoneFile(const std::string& path) {
-  const std::optional<std::string> bytes = ReadRegularFile(path, kMaxZoneFileBytes);
+std::optional<Tzif> ReadZoneFile(const std::string& path,
+                                 FileIdentity* identity = nullptr) {
+  const std::optional<std::string> bytes =
+      ReadRegularFile(path, kMaxZoneFileBytes, identity);
   if (!bytes) return std::nullopt;
   return ParseTzif(*bytes);
 }
@@ -83,7 +85,7 @@ ZoneSettings ZoneSettings::FromEnvironment() {
 LoadedZone LoadZone(const ZoneSettings& settings) {
   LoadedZone zone;
   if (!settings.tz) {
-    zone.tzif = ReadZoneFile(settings.localtime_path);
+    zone.tzif = ReadZoneFile(settings.localtime_path, &zone.file_identity);
     if (zone.tzif) {
       zone.source = LoadedZone::Source::kFile;
       zone.file_path = settings.localtime_path;
@@ -98,7 +100,7 @@ LoadedZone LoadZone(const ZoneSettings& settings) {
   const std::string path = name.front() == '/'
                                ? std::string(name)
                                : settings.zone_folder + "/" + std::string(name);
-  zone.tzif = ReadZoneFile(path);
+  zone.tzif = ReadZoneFile(path, &zone.file_identity);
   if (zone.tzif) {
     zone.source = LoadedZone::Source::kFile;
     zone.file_path = path;

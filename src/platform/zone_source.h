@@ -30,6 +30,7 @@
 #include <string>
 
 #include "platform/posix_rule.h"
+#include "platform/regular_file.h"
 #include "platform/tzif.h"
 
 namespace datetimelib::platform {
@@ -51,6 +52,7 @@ struct LoadedZone {
   };
   Source source = Source::kUtc;
   std::string file_path;
+  FileIdentity file_identity;  // of the file read, with kFile
   std::optional<Tzif> tzif;
   std::optional<PosixRule> rule;
   // With a rule that names daylight time without transition rules: the

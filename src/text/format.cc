@@ -3,16 +3,42 @@
 #include "platform/local_time.h"
 #include "text/strftime_text.h"
 
+// What the formatters give for a value that is not valid (and for a valid one
+// with a null pattern): the kept text of an outOfRange value, else nothing.
+// Copied and cleared in place, so that `out` keeps its capacity.
+void AdDateTime::WriteNotValid(std::string& out) const {
+  if (status_ == outOfRange) {
+    out.assign(kept_text_);
+  } else {
+    out.clear();
+  }
+}
+
+void AdDateTime::FormatInto(std::string& out, const char* pattern) const {
+  if (status_ != valid || pattern == nullptr) {
+    WriteNotValid(out);
+    return;
+  }
+  datetimelib::WritePattern(datetimelib::platform::BreakDownLocal(seconds_), pattern,
+                            &out);
+}
+
+void AdDateTime::FormatGMTInto(std::string& out, const char* pattern) const {
+  if (status_ != valid || pattern == nullptr) {
+    WriteNotValid(out);
+    return;
+  }
+  datetimelib::WritePattern(datetimelib::platform::BreakDownUtc(seconds_), pattern, &out);
+}
+
 std::string AdDateTime::Format(const char* pattern) const {
-  if (status_ != valid) return status_ == outOfRange ? kept_text_ : std::string();
-  if (pattern == nullptr) return {};
-  return datetimelib::StrftimeText(datetimelib::platform::BreakDownLocal(seconds_),
-                                   pattern);
+  std::string text;
+  FormatInto(text, pattern);
+  return text;
 }
 
 std::string AdDateTime::FormatGMT(const char* pattern) const {
-  if (status_ != valid) return status_ == outOfRange ? kept_text_ : std::string();
-  if (pattern == nullptr) return {};
-  return datetimelib::StrftimeText(datetimelib::platform::BreakDownUtc(seconds_),
-                                   pattern);
+  std::string text;
+  FormatGMTInto(text, pattern);
+  return text;
 }

@@ -30,7 +30,9 @@ std::string TransitionText(const platform::TransitionRule& transition, int year,
   const AdDateTime value(date.year, date.month, date.day, second_of_day / 3600,
                          second_of_day / 60 % 60, second_of_day % 60);
   if (!value.IsValid()) return value.Format(kCanonicalPattern);
-  return StrftimeText(platform::BreakDownUtc(civil), kCanonicalPattern);
+  std::string text;
+  WritePattern(platform::BreakDownUtc(civil), kCanonicalPattern, &text);
+  return text;
 }
 
 }  // namespace

@@ -74,3 +74,27 @@ TEST(Civil, ExtremeFieldsAreExactOrRefused) {
 }
 
 }  // namespace
+
+namespace {
+
+// The 32-bit forms agree with the general algorithms over their whole range, at
+// every day and at seconds that fall on each side of midnight.
+TEST(Civil, FastFieldsAgreeWithGeneral) {
+  using datetimelib::platform::FastCivilFields;
+  using datetimelib::platform::kFastCivilLimit;
+  using datetimelib::platform::WeekdayFromDays;
+  for (std::int64_t days = -kFastCivilLimit + 1; days < kFastCivilLimit - 1; days += 3) {
+    for (const std::int64_t second_of_day : {std::int64_t{0}, std::int64_t{86399}}) {
+      const auto fast = FastCivilFields(days * 86400 + second_of_day);
+      const auto general = CivilFromDays(days);
+      ASSERT_EQ(fast.date.year, general.year) << days;
+      ASSERT_EQ(fast.date.month, general.month) << days;
+      ASSERT_EQ(fast.date.day, general.day) << days;
+      ASSERT_EQ(fast.yearday, YearDay(general.year, general.month, general.day)) << days;
+      ASSERT_EQ(fast.weekday, WeekdayFromDays(days)) << days;
+      ASSERT_EQ(fast.hour * 3600 + fast.minute * 60 + fast.second, second_of_day) << days;
+    }
+  }
+}
+
+}  // namespace
