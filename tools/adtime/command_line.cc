@@ -5,10 +5,10 @@
 namespace adtime {
 namespace {
 
-const OptionSpec* FindSpec(const std::string& name,
-                           const std::vector<OptionSpec>& specs) {
-  for (const OptionSpec& spec : specs) {
-    if (name == spec.name) return &spec;
+const OptionRule* FindOption(const std::string& name,
+                           const std::vector<OptionRule>& options) {
+  for (const OptionRule& option : options) {
+    if (name == option.name) return &option;
   }
   return nullptr;
 }
@@ -29,7 +29,7 @@ std::string CommandLine::Get(const std::string& name, const std::string& fallbac
 }
 
 CommandLine ParseCommandLine(const std::vector<std::string>& args,
-                             const std::vector<OptionSpec>& specs) {
+                             const std::vector<OptionRule>& options) {
   CommandLine parsed;
   bool options_ended = false;
   for (std::size_t i = 0; i < args.size(); ++i) {
@@ -51,9 +51,9 @@ CommandLine ParseCommandLine(const std::vector<std::string>& args,
     const std::size_t equals = arg.find('=');
     const std::string name =
         arg.substr(2, equals == std::string::npos ? equals : equals - 2);
-    const OptionSpec* spec = FindSpec(name, specs);
-    if (spec == nullptr) throw UsageError("unknown option --" + name);
-    if (!spec->takes_value) {
+    const OptionRule* option = FindOption(name, options);
+    if (option == nullptr) throw UsageError("unknown option --" + name);
+    if (!option->takes_value) {
       if (equals != std::string::npos) throw UsageError("--" + name + " takes no value");
       parsed.options[name] = "";
     } else if (equals != std::string::npos) {

@@ -15,7 +15,7 @@ class UsageError : public std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
-struct OptionSpec {
+struct OptionRule {
   const char* name;  // long name without the dashes: "output"
   bool takes_value;
 };
@@ -35,7 +35,7 @@ struct CommandLine {
 // twice keeps its last value. Throws UsageError for an unknown option or a
 // missing value.
 CommandLine ParseCommandLine(const std::vector<std::string>& args,
-                             const std::vector<OptionSpec>& specs);
+                             const std::vector<OptionRule>& options);
 
 }  // namespace adtime
 

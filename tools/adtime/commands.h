@@ -30,8 +30,8 @@ inline constexpr int kExitIoError = 2;
 inline constexpr const char* kCanonicalPattern = "%Y-%m-%d %H:%M:%S";
 
 // The options every subcommand takes besides its own.
-inline const OptionSpec kHelpOption{"help", false};
-inline const OptionSpec kOutputOption{"output", true};
+inline const OptionRule kHelpOption{"help", false};
+inline const OptionRule kOutputOption{"output", true};
 
 // The --output choice of `command_line`, text when not given.
 OutputFormat OutputFormatOf(const CommandLine& command_line);

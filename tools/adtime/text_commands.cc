@@ -137,12 +137,12 @@ bool ConvertStandardInput(Reader reader, OutputFormat format, OutputBuffer* out,
 }
 
 int RunConversions(const Args& args, const char* help, bool is_read) {
-  std::vector<OptionSpec> specs = {kHelpOption, kOutputOption};
+  std::vector<OptionRule> options = {kHelpOption, kOutputOption};
   if (is_read) {
-    specs.push_back({"gmt", false});
-    specs.push_back({"locale", true});
+    options.push_back({"gmt", false});
+    options.push_back({"locale", true});
   }
-  const CommandLine command_line = ParseCommandLine(args, specs);
+  const CommandLine command_line = ParseCommandLine(args, options);
   if (command_line.Has("help")) return PrintHelp(help);
   const OutputFormat format = OutputFormatOf(command_line);
   if (command_line.operands.empty()) {
