@@ -8,9 +8,10 @@
 #include "platform/current_zone.h"
 
 namespace datetimelib::platform {
-BrokenDownTime BreakDownUtc(std::int64_t unix_seconds) {
-  const CivilFields civil = CivilFieldsOf(unix_seconds);
-  BrokenDownTime out{};
+BrokenDownTime BrokenDownAt(std::int64_t civil_seconds, std::int32_t utc_offset,
+                            bool is_dst, const char* abbreviation) {
+  const CivilFields civil = CivilFieldsOf(civil_seconds);
+  BrokenDownTime out;
   out.year = static_cast<int>(civil.date.year);
   out.month = civil.date.month;
   out.day = civil.date.day;
@@ -19,8 +20,16 @@ BrokenDownTime BreakDownUtc(std::int64_t unix_seconds) {
   out.second = civil.second;
   out.weekday = civil.weekday;
   out.yearday = civil.yearday;
-  std::memcpy(out.abbreviation, "GMT", 4);
+  out.utc_offset = utc_offset;
+  out.is_dst = is_dst;
+  const std::size_t length = strnlen(abbreviation, sizeof out.abbreviation - 1);
+  std::memcpy(out.abbreviation, abbreviation, length);
+  out.abbreviation[length] = '\0';
   return out;
+}
+
+BrokenDownTime BreakDownUtc(std::int64_t unix_seconds) {
+  return BrokenDownAt(unix_seconds, 0, false, "GMT");
 }
 
 BrokenDownTime BreakDownLocal(std::int64_t unix_seconds) {

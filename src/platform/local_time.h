@@ -33,6 +33,12 @@ struct BrokenDownTime {
 // The local fields of an instant.
 BrokenDownTime BreakDownLocal(std::int64_t unix_seconds);
 
+// The fields of `civil_seconds` (see civil.h) read in a zone whose offset is
+// `utc_offset` seconds east, with that daylight flag and abbreviation (cut to 15
+// bytes).
+BrokenDownTime BrokenDownAt(std::int64_t civil_seconds, std::int32_t utc_offset,
+                            bool is_dst, const char* abbreviation);
+
 // The UTC fields of an instant; abbreviation "GMT". Pure arithmetic.
 BrokenDownTime BreakDownUtc(std::int64_t unix_seconds);
 

@@ -47,21 +47,8 @@ const ZoneTimeline::LocalType& ZoneTimeline::TypeAt(std::int64_t unix_seconds) c
 
 BrokenDownTime ZoneTimeline::BreakDown(std::int64_t unix_seconds) const {
   const LocalType& type = TypeAt(unix_seconds);
-  const CivilFields civil = CivilFieldsOf(unix_seconds + type.utc_offset);
-  BrokenDownTime out;
-  out.year = static_cast<int>(civil.date.year);
-  out.month = civil.date.month;
-  out.day = civil.date.day;
-  out.hour = civil.hour;
-  out.minute = civil.minute;
-  out.second = civil.second;
-  out.weekday = civil.weekday;
-  out.yearday = civil.yearday;
-  out.utc_offset = type.utc_offset;
-  out.is_dst = type.is_dst;
-  static_assert(sizeof out.abbreviation == sizeof type.abbreviation);
-  std::copy(std::begin(type.abbreviation), std::end(type.abbreviation), out.abbreviation);
-  return out;
+  return BrokenDownAt(unix_seconds + type.utc_offset, type.utc_offset, type.is_dst,
+                      type.abbreviation);
 }
 
 std::int64_t ZoneTimeline::Compose(std::int64_t civil_seconds) const {
