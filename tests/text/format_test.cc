@@ -11,67 +11,101 @@ using datetimelib::testing::TzGuard;
 
 constexpr const char* kCanonical = "%Y-%m-%d %H:%M:%S";
 
+AdDateTime At(std::int64_t count) {
+  return AdDateTime(AdTime(static_cast<std::int32_t>(count)));
+}
+
+AdDateTime WithStatus(AdDateTime value, AdDateTime::AdDateTimeStatus status) {
+  value.SetStatus(status);
+  return value;
+}
+
+// For a value that is not valid, Format and FormatGMT with a pattern and Format
+// with flags and a locale show the kept text of an outOfRange value and nothing
+// else; FormatTolvane writes the count held, whatever the status.
+TEST(Formatters, StatusRule) {
+  TzGuard tz("UTC");
+  AdDateTime unreadable = At(1000000000);
+  unreadable.ParseDateTime("not a date");         // invalid; count and text kept
+  const AdDateTime refused(2040, 1, 5, 7, 3, 0);  // outOfRange, count 0
+  const struct {
+    AdDateTime value;
+    const char* text;
+    const char* compact;
+  } cases[] = {
+      {AdDateTime(), "", "01-Jan-1970.00:00:00"},
+      {unreadable, "", "09-Sep-2001.01:46:40"},
+      {refused, "2040/1/5 7:3:0", "01-Jan-1970.00:00:00"},
+      {WithStatus(At(1000000000), AdDateTime::outOfRange), "", "09-Sep-2001.01:46:40"},
+  };
+  for (const auto& c : cases) {
+    SCOPED_TRACE(testing::Message() << "row " << &c - cases);
+    for (const char* pattern : {kCanonical, "%H"}) {
+      EXPECT_EQ(c.value.Format(pattern), c.text) << pattern;
+      EXPECT_EQ(c.value.FormatGMT(pattern), c.text) << pattern;
+    }
+    EXPECT_EQ(c.value.Format(AdDateTime::dateOnly, AdDateTime::invariantLocale), c.text);
+    EXPECT_EQ(c.value.FormatTolvane(), c.compact);
+    std::string out = "stale";
+    c.value.FormatInto(out, kCanonical);
+    EXPECT_EQ(out, c.text);
+  }
+}
+
+// The canonical text at the range ends, in UTC and one hour east.
 TEST(Format, CanonicalTextLocalAndGmt) {
+  TzGuard tz("<+01>-1");
   const struct {
     std::int32_t count;
     const char* gmt;
-    const char* east;  // "<+01>-1"
+    const char* east;
   } cases[] = {
       {0, "1970-01-01 00:00:00", "1970-01-01 01:00:00"},
       {1000000000, "2001-09-09 01:46:40", "2001-09-09 02:46:40"},
       {2147483647, "2038-01-19 03:14:07", "2038-01-19 04:14:07"},
-      {-1, "1969-12-31 23:59:59", "1970-01-01 00:59:59"},
-  };
-  TzGuard tz("<+01>-1");
-  for (const auto& c : cases) {
-    const AdDateTime value(AdTime(c.count));
-    EXPECT_EQ(value.FormatGMT(kCanonical), c.gmt);
-    EXPECT_EQ(value.Format(kCanonical), c.east);
-  }
-}
-
-TEST(Format, StatusRule) {
-  AdDateTime invalid_value(AdTime(0));
-  invalid_value.ParseDateTime("not a date");
-  AdDateTime refused(2040, 1, 1, 0, 0, 0);
-  AdDateTime refused_without_text(AdTime(0));
-  refused_without_text.SetStatus(AdDateTime::outOfRange);
-  AdDateTime unknown_status(2040, 1, 1, 0, 0, 0);
-  unknown_status.SetStatus(static_cast<AdDateTime::AdDateTimeStatus>(4));
-
-  const struct {
-    const AdDateTime* value;
-    const char* text;
-  } cases[] = {
-      {new AdDateTime(), ""},      {&invalid_value, ""},  {&refused, "2040/1/1 0:0:0"},
-      {&refused_without_text, ""}, {&unknown_status, ""},
   };
   for (const auto& c : cases) {
-    for (const char* pattern : {kCanonical, "%H", "", "literal"}) {
-      EXPECT_EQ(c.value->Format(pattern), c.text) << pattern;
-      EXPECT_EQ(c.value->FormatGMT(pattern), c.text) << pattern;
-    }
+    EXPECT_EQ(At(c.count).FormatGMT(kCanonical), c.gmt);
+    EXPECT_EQ(At(c.count).Format(kCanonical), c.east);
   }
-  delete cases[0].value;
 }
 
 TEST(Format, PatternsAndLimits) {
   TzGuard tz("America/New_York");
-  const AdDateTime summer(AdTime(1053194589));  // 2003-05-17 14:03:09 EDT
-  EXPECT_EQ(summer.Format("%Z %z"), "EDT -0400");
+  const AdDateTime summer = At(1053194589);  // 2003-05-17 14:03:09 EDT
+  EXPECT_EQ(summer.Format("%a %b %j %Z %z"), "Sat May 137 EDT -0400");
   EXPECT_EQ(summer.FormatGMT("%Z %z %H"), "GMT +0000 18");
-  EXPECT_EQ(summer.Format("%a %b %j"), "Sat May 137");
-  EXPECT_EQ(summer.Format(""), "");
   EXPECT_EQ(summer.Format(nullptr), "");
   EXPECT_EQ(summer.FormatGMT(nullptr), "");
-  EXPECT_EQ(summer.Format("%p"), "PM");
-
   // A long pattern is written whole, not cut.
   std::string pattern;
   for (int i = 0; i < 2000; ++i) pattern += "%Y-%m-%d %H:%M:%S|";
   const std::string text = summer.Format(pattern.c_str());
   EXPECT_EQ(text.size(), 2000u * 20);
   EXPECT_EQ(text.substr(0, 20), "2003-05-17 14:03:09|");
+}
+
+// The canonical and the compact text, written digit by digit into the caller's
+// buffer, are what strftime writes ("%T" is "%H:%M:%S", spelt so as to take the
+// strftime path; "%b" is English in the "C" locale), across the whole range.
+TEST(FormatInto, DirectDigitsAgreeWithStrftime) {
+  std::string out;
+  out.reserve(64);
+  const char* const buffer = out.data();
+  for (const char* zone : {"Australia/Lord_Howe", "America/New_York", "<-0930>9:30"}) {
+    TzGuard tz(zone);
+    for (std::int64_t t = INT32_MIN; t <= INT32_MAX; t += 23 * 86400 + 3 * 3600 + 61) {
+      SCOPED_TRACE(testing::Message() << zone << " " << t);
+      const AdDateTime value = At(t);
+      value.FormatInto(out, kCanonical);
+      ASSERT_EQ(out, value.Format("%Y-%m-%d %T"));
+      value.FormatGMTInto(out, kCanonical);
+      ASSERT_EQ(out, value.FormatGMT("%Y-%m-%d %T"));
+      value.FormatTolvaneInto(out);
+      ASSERT_EQ(out, value.Format("%d-%b-%Y.%H:%M:%S"));
+    }
+  }
+  EXPECT_EQ(out.data(), buffer);  // never reallocated
 }
 
 }  // namespace

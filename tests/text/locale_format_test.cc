@@ -2,6 +2,7 @@
 
 #include <clocale>
 #include <string>
+#include <utility>
 
 #include "AdDateTime.h"
 #include "support/test_locales.h"
@@ -10,104 +11,90 @@
 namespace {
 
 using datetimelib::testing::EnvGuard;
+using datetimelib::testing::ThreadLocale;
 using datetimelib::testing::TzGuard;
 
-constexpr std::uint32_t kFlags[] = {AdDateTime::dateAndTime, AdDateTime::timeOnly,
-                                    AdDateTime::dateOnly};
+// Each locale writes its own forms (%x, %X, and "%x %X" for both flags or none;
+// other bits play no part), and ParseDateTime reads back in the calling thread's
+// locale what that locale writes, over counts across the whole range.
+TEST(FormatInLocale, EachLocaleReadsBackWhatItWrites) {
+  DATETIMELIB_NEED_TEST_LOCALES();
+  TzGuard tz("<+01>-1");  // no repeated hour to blur the read-back
+  const struct {
+    std::uint32_t id;
+    const char* name;
+    const char* date;  // 2003-05-17 14:03:09
+    const char* time;
+  } locales[] = {
+      {127, "C", "05/17/03", "14:03:09"},
+      {1033, "en_US.UTF-8", "05/17/2003", "02:03:09 PM"},
+      {2057, "en_GB.UTF-8", "17/05/03", "14:03:09"},
+      {1031, "de_DE.UTF-8", "17.05.2003", "14:03:09"},
+      {1036, "fr_FR.UTF-8", "17/05/2003", "14:03:09"},
+      {1041, "ja_JP.UTF-8", "2003年05月17日", "14時03分09秒"},
+      {1049, "C", "05/17/03", "14:03:09"},  // known, but not installed here
+  };
+  const AdDateTime may17(AdTime(1053180189 - 3600));
+  for (const auto& l : locales) {
+    SCOPED_TRACE(l.id);
+    const std::string both = std::string(l.date) + " " + l.time;
+    EXPECT_EQ(may17.Format(0x80000000u | AdDateTime::dateOnly, l.id), l.date);
+    EXPECT_EQ(may17.Format(AdDateTime::timeOnly, l.id), l.time);
+    EXPECT_EQ(may17.Format(AdDateTime::dateAndTime, l.id), both);
+    EXPECT_EQ(may17.Format(AdDateTime::dateOnly | AdDateTime::timeOnly, l.id), both);
 
-TEST(FormatInLocale, StatusRule) {
-  AdDateTime never_set;
-  AdDateTime unreadable(AdTime(0));
-  unreadable.ParseDateTime("not a date");
-  AdDateTime refused(2040, 1, 1, 0, 0, 0);
-  AdDateTime refused_without_text(AdTime(0));
-  refused_without_text.SetStatus(AdDateTime::outOfRange);
-  AdDateTime unknown_status(2040, 1, 1, 0, 0, 0);
-  unknown_status.SetStatus(static_cast<AdDateTime::AdDateTimeStatus>(4));
-  for (const std::uint32_t flags : kFlags) {
-    for (const std::uint32_t locale : {127u, 1033u, 1024u, 4242u}) {
-      EXPECT_EQ(never_set.Format(flags, locale), "");
-      EXPECT_EQ(unreadable.Format(flags, locale), "");
-      EXPECT_EQ(refused.Format(flags, locale), "2040/1/1 0:0:0");
-      EXPECT_EQ(refused_without_text.Format(flags, locale), "");
-      EXPECT_EQ(unknown_status.Format(flags, locale), "");
+    const ThreadLocale thread_locale(l.name);
+    ASSERT_TRUE(thread_locale.ok());
+    for (std::int64_t t = 0; t <= INT32_MAX - 3600; t += 23 * 86400 + 3 * 3600 + 61) {
+      const AdDateTime written(AdTime(static_cast<std::int32_t>(t)));
+      const std::string canonical = written.Format("%F %T");
+      const std::pair<std::uint32_t, std::string> forms[] = {
+          {AdDateTime::dateAndTime, canonical},
+          {AdDateTime::dateOnly, canonical.substr(0, 10) + " 00:00:00"},
+          {AdDateTime::timeOnly, "1970-01-01" + canonical.substr(10)}};
+      for (const auto& [flags, read_back] : forms) {
+        const std::string text = written.Format(flags, l.id);
+        AdDateTime read;
+        ASSERT_EQ(read.ParseDateTime(text.c_str()), 1) << text;
+        ASSERT_EQ(read.Format("%F %T"), read_back) << text;
+      }
     }
   }
 }
 
-// 2003-05-17 14:03:09 local time, in a zone one hour east of UTC.
-TEST(FormatInLocale, EachLocaleAndFlag) {
-  DATETIMELIB_NEED_TEST_LOCALES();
-  TzGuard tz("<+01>-1");
-  const AdDateTime value(AdTime(1053180189 - 3600));
-  const struct {
-    std::uint32_t locale;
-    const char* both;
-    const char* time;
-    const char* date;
-  } cases[] = {
-      {127, "05/17/03 14:03:09", "14:03:09", "05/17/03"},
-      {1033, "05/17/2003 02:03:09 PM", "02:03:09 PM", "05/17/2003"},
-      {2057, "17/05/03 14:03:09", "14:03:09", "17/05/03"},
-      {1031, "17.05.2003 14:03:09", "14:03:09", "17.05.2003"},
-      {1036, "17/05/2003 14:03:09", "14:03:09", "17/05/2003"},
-      {1041, "2003年05月17日 14時03分09秒", "14時03分09秒", "2003年05月17日"},
-      // Unknown numbers, and known ones whose locale is not installed here.
-      {0, "05/17/03 14:03:09", "14:03:09", "05/17/03"},
-      {1047, "05/17/03 14:03:09", "14:03:09", "05/17/03"},
-      {0xFFFFFFFF, "05/17/03 14:03:09", "14:03:09", "05/17/03"},
-      {1049, "05/17/03 14:03:09", "14:03:09", "05/17/03"},
-      {2052, "05/17/03 14:03:09", "14:03:09", "05/17/03"},
-  };
-  for (const auto& c : cases) {
-    SCOPED_TRACE(c.locale);
-    EXPECT_EQ(value.Format(AdDateTime::dateAndTime, c.locale), c.both);
-    EXPECT_EQ(value.Format(AdDateTime::timeOnly, c.locale), c.time);
-    EXPECT_EQ(value.Format(AdDateTime::dateOnly, c.locale), c.date);
-    // Other bits play no part; both bits write date and time.
-    EXPECT_EQ(value.Format(0x80000000u | AdDateTime::dateOnly, c.locale), c.date);
-    EXPECT_EQ(value.Format(AdDateTime::timeOnly | AdDateTime::dateOnly, c.locale),
-              c.both);
-  }
-}
-
-// 1024 follows LC_ALL, else LC_TIME, else LANG, at each call.
-TEST(FormatInLocale, UserDefaultFromEnvironment) {
+// The user's default locale (1024) follows LC_ALL, else LC_TIME, else LANG, at
+// each call. Format writes in it, and ParseDateTime reads in it a second time a
+// text that the thread's locale ("C" here) refuses, cut before a "." in 20th
+// place. The system default (2048) is the process-wide locale.
+TEST(FormatInLocale, DefaultLocales) {
   DATETIMELIB_NEED_TEST_LOCALES();
   TzGuard tz("UTC");
-  const AdDateTime value(AdTime(1053180189));
+  const AdDateTime may17(AdTime(1053180189));  // 2003-05-17 14:03:09
   const struct {
     const char* lc_all;
     const char* lc_time;
     const char* lang;
-    const char* date;
+    const char* both;
+    bool second_read;  // of `both` with ".5": 19 bytes that "C" refuses
   } cases[] = {
-      {nullptr, nullptr, nullptr, "05/17/03"},
-      {nullptr, nullptr, "de_DE.UTF-8", "17.05.2003"},
-      {nullptr, "fr_FR.UTF-8", "de_DE.UTF-8", "17/05/2003"},
-      {"en_US.UTF-8", "fr_FR.UTF-8", "de_DE.UTF-8", "05/17/2003"},
-      {"", "", "de_DE.utf8", "17.05.2003"},                 // empty counts as unset
-      {"xx_XX.UTF-8", "fr_FR.UTF-8", nullptr, "05/17/03"},  // not installed: "C"
+      {nullptr, nullptr, "de_DE.UTF-8", "17.05.2003 14:03:09", true},
+      {nullptr, "fr_FR.UTF-8", "de_DE.UTF-8", "17/05/2003 14:03:09", true},
+      {"en_US.UTF-8", "fr_FR.UTF-8", "de_DE.UTF-8", "05/17/2003 02:03:09 PM", false},
+      {"", "", "de_DE.utf8", "17.05.2003 14:03:09", true},  // empty counts as unset
+      {"xx_XX.UTF-8", "fr_FR.UTF-8", nullptr, "05/17/03 14:03:09", false},  // "C"
   };
   for (const auto& c : cases) {
+    SCOPED_TRACE(testing::Message() << "row " << &c - cases);
     const EnvGuard lc_all("LC_ALL", c.lc_all);
     const EnvGuard lc_time("LC_TIME", c.lc_time);
     const EnvGuard lang("LANG", c.lang);
-    EXPECT_EQ(value.Format(AdDateTime::dateOnly, AdDateTime::userDefaultLocale), c.date)
-        << (c.lc_all ? c.lc_all : "-") << " " << (c.lc_time ? c.lc_time : "-") << " "
-        << (c.lang ? c.lang : "-");
+    EXPECT_EQ(may17.Format(AdDateTime::dateAndTime, AdDateTime::userDefaultLocale),
+              c.both);
+    AdDateTime read;
+    EXPECT_EQ(read.ParseDateTime((std::string(c.both) + ".5").c_str()), c.second_read);
   }
-}
-
-// 2048 is the process-wide locale: "C" until setlocale names another.
-TEST(FormatInLocale, SystemDefaultIsProcessLocale) {
-  DATETIMELIB_NEED_TEST_LOCALES();
-  TzGuard tz("UTC");
-  const AdDateTime value(AdTime(1053180189));
-  EXPECT_EQ(value.Format(AdDateTime::dateOnly, AdDateTime::systemDefaultLocale),
-            "05/17/03");
   ASSERT_NE(std::setlocale(LC_ALL, "de_DE.UTF-8"), nullptr);
-  EXPECT_EQ(value.Format(AdDateTime::dateOnly, AdDateTime::systemDefaultLocale),
+  EXPECT_EQ(may17.Format(AdDateTime::dateOnly, AdDateTime::systemDefaultLocale),
             "17.05.2003");
   std::setlocale(LC_ALL, "C");
 }
