@@ -45,19 +45,6 @@ class TempDir {
   std::string path_;
 };
 
-// The bytes of a file, or "" when it cannot be read.
-inline std::string ReadFileBytes(const std::string& path) {
-  std::string bytes;
-  if (std::FILE* file = std::fopen(path.c_str(), "rb")) {
-    char chunk[4096];
-    std::size_t count = 0;
-    while ((count = std::fread(chunk, 1, sizeof chunk, file)) > 0)
-      bytes.append(chunk, count);
-    std::fclose(file);
-  }
-  return bytes;
-}
-
 }  // namespace datetimelib::testing
 
 #endif  // DATETIMELIB_TESTS_SUPPORT_TEMP_DIR_H_
