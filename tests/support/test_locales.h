@@ -11,6 +11,8 @@
 #include <optional>
 #include <string>
 
+#include "support/env_guard.h"
+
 namespace datetimelib::testing {
 
 // Whether the compiled test locales can be opened.
@@ -43,31 +45,6 @@ class ThreadLocale {
  private:
   locale_t locale_;
   locale_t previous_;
-};
-
-// Sets (or, for nullptr, unsets) one environment variable for the lifetime of
-// the guard, and restores it.
-class EnvGuard {
- public:
-  EnvGuard(const char* name, const char* value) : name_(name) {
-    if (const char* old = std::getenv(name)) saved_ = old;
-    Set(value);
-  }
-  ~EnvGuard() { Set(saved_ ? saved_->c_str() : nullptr); }
-  EnvGuard(const EnvGuard&) = delete;
-  EnvGuard& operator=(const EnvGuard&) = delete;
-
- private:
-  void Set(const char* value) {
-    if (value == nullptr) {
-      unsetenv(name_.c_str());
-    } else {
-      setenv(name_.c_str(), value, 1);
-    }
-  }
-
-  std::string name_;
-  std::optional<std::string> saved_;
 };
 
 }  // namespace datetimelib::testing
