@@ -23,11 +23,29 @@ void AppendHexByte(const char* prefix, unsigned char byte, std::string* out) {
 // and `special(byte, well_formed)` for each control byte or stray byte, in order.
 // Printable stretches are handed over whole, which keeps the common case a plain
 // append.
+// Bytes that stand for themselves in every output: printable ASCII but the quote
+// and the backslash.
+constexpr bool IsPlainAscii(unsigned char byte) {
+  return byte >= 0x20 && byte < 0x7F && byte != '"' && byte != '\\';
+}
+
+struct PlainAsciiTable {
+  bool plain[256] = {};
+  constexpr PlainAsciiTable() {
+    for (int byte = 0; byte < 256; ++byte)
+      plain[byte] = IsPlainAscii(static_cast<unsigned char>(byte));
+  }
+};
+constexpr PlainAsciiTable kPlainAscii;
+
 template <typename Plain, typename Special>
 void ForEachPiece(std::string_view text, Plain plain, Special special) {
   std::size_t run_start = 0;
   std::size_t i = 0;
   while (i < text.size()) {
+    // Most text is plain ASCII: skip it with one table lookup a byte.
+    while (i < text.size() && kPlainAscii.plain[Byte(text[i])]) ++i;
+    if (i == text.size()) break;
     const unsigned char byte = Byte(text[i]);
     std::size_t length = 1;
     bool is_special = false;
