@@ -67,6 +67,7 @@ class ZoneTimeline {
   void BuildFromFile(const Tzif& file);
   void BuildFromRule(const PosixRule& rule);
   void BuildFromDefaultRules(const PosixRule& rule, const Tzif& default_rules);
+  void FollowFooterFrom(const std::string& footer, std::int64_t last_transition);
   void Finish();
 
   // Period i covers the instants [starts_[i], starts_[i + 1]); starts_[0] is the

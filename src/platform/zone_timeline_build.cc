@@ -113,12 +113,20 @@ void ZoneTimeline::BuildFromFile(const Tzif& file) {
   for (std::size_t i = 0; i < file.transition_times.size(); ++i) {
     AddPeriod(file.transition_times[i], file.transition_types[i]);
   }
-  const std::optional<PosixRule> footer = ParsePosixRule(file.footer);
-  if (!footer || footer->dst == PosixRule::Dst::kWithoutRules) return;
+  FollowFooterFrom(file.footer, file.transition_times.back());
+}
 
-  const std::int64_t last_transition = file.transition_times.back();
-  if (last_transition >= NewYearInstant(kTableEndYear)) return;
-  // The rule, not the last transition's type, answers from the last transition on.
+// From the last transition on, the footer rule answers, not the last
+// transition's type: as periods up to the table's end, per instant beyond it. A
+// footer that does not parse, or names daylight time without rules, leaves the
+// last type in force.
+void ZoneTimeline::FollowFooterFrom(const std::string& footer_text,
+                                    std::int64_t last_transition) {
+  const std::optional<PosixRule> footer = ParsePosixRule(footer_text);
+  if (!footer || footer->dst == PosixRule::Dst::kWithoutRules ||
+      last_transition >= NewYearInstant(kTableEndYear)) {
+    return;
+  }
   if (starts_.back() == last_transition) {
     starts_.pop_back();
     period_types_.pop_back();
@@ -181,19 +189,7 @@ void ZoneTimeline::BuildFromDefaultRules(const PosixRule& rule, const Tzif& file
     AddPeriod(at, type.is_dst ? daylight : standard);
     last_transition = at;
   }
-  const std::optional<PosixRule> footer = ParsePosixRule(file.footer);
-  if (file.transition_times.empty() || !footer ||
-      footer->dst == PosixRule::Dst::kWithoutRules ||
-      last_transition >= NewYearInstant(kTableEndYear)) {
-    return;
-  }
-  if (starts_.back() == last_transition) {
-    starts_.pop_back();
-    period_types_.pop_back();
-  }
-  SetRule(*footer);
-  table_to_ = NewYearInstant(kTableEndYear);
-  AddRulePeriods(last_transition, table_to_);
+  if (!file.transition_times.empty()) FollowFooterFrom(file.footer, last_transition);
 }
 
 // Bucket b of the index holds the last of `starts` at or before the bucket's
