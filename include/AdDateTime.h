@@ -232,7 +232,8 @@ class DATETIMELIB_API AdDateTime {
   // writes names such as %a and %b). The canonical pattern "%Y-%m-%d %H:%M:%S"
   // gives exactly 19 characters for every count from 0 to 2 147 483 647.
   // Example: Format("%Y-%m-%d %H:%M:%S") gives "2003-05-17 14:03:09".
-  // A null pattern gives the empty text.
+  // A null pattern gives the empty text. A field width above 1024 ("%2000d") is
+  // not applied: that conversion is written as it stands in the pattern.
   std::string Format(const char* pattern) const;
 
   // The same in UTC: no zone, no daylight saving; %Z writes "GMT".

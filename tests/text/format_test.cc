@@ -83,6 +83,25 @@ TEST(Format, PatternsAndLimits) {
   const std::string text = summer.Format(pattern.c_str());
   EXPECT_EQ(text.size(), 2000u * 20);
   EXPECT_EQ(text.substr(0, 20), "2003-05-17 14:03:09|");
+
+  // Field widths are applied however short the pattern, up to 1024; a wider one
+  // is written as it stands rather than asking for the memory it names. An
+  // empty conversion stays empty, and a lone "%" ends the text as strftime ends it.
+  const struct {
+    const char* pattern;
+    std::string expected;
+  } widths[] = {
+      {"%600d", std::string(598, '0') + "17"},
+      {"<%_1024H>", "<" + std::string(1022, ' ') + "14>"},
+      {"%1025d|%2147483648Y|%99999999999999999999m",
+       "%1025d|%2147483648Y|%99999999999999999999m"},
+      {"%-5d%%%E", "   17%%E"},
+      {"%30p", std::string(28, ' ') + "PM"},
+      {"%Y%", "2003%"},
+  };
+  for (const auto& [wide, expected] : widths) {
+    EXPECT_EQ(summer.Format(wide), expected) << wide;
+  }
 }
 
 // The canonical and the compact text, written digit by digit into the caller's
