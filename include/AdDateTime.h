@@ -370,7 +370,8 @@ class DATETIMELIB_API AdDateTime {
   //   sign, anything after them ignored. No range test: hour 25 is carried.
   // * After the time, "UTC" (upper case: "utc" is ignored text and the time
   //   stays local), optionally with "+" or "-" and hours [":" minutes], at most
-  //   13 hours and 59 minutes.
+  //   13 hours and 59 minutes either way (a sign inside a number counts:
+  //   "UTC+-2" is two hours back, "UTC+-14" is refused).
   //
   // Refused, leaving the count and the kept text as they were (status
   // `invalid`): a "." first or last ("05-Jan-2003.", ".10:00"); an unknown word

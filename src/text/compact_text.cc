@@ -107,7 +107,9 @@ bool ReadDatePart(std::string_view date, const LocalToday& today, TypedDateTime*
 }
 
 // offset := ("+" | "-") hours [ ":" minutes ]   hours up to 13, minutes up to 59
-// Neither has a lower bound: "+-20" passes as minus twenty hours, as it always has.
+// A sign inside a number still reads ("+-2" is minus two hours, as it always
+// has), but never beyond 13 hours or 59 minutes either way: "+-159" would move
+// the time by a week.
 std::optional<std::int64_t> ReadOffset(std::string_view text) {
   if (text.empty()) return 0;
   const char sign = text[0];
@@ -116,7 +118,7 @@ std::optional<std::int64_t> ReadOffset(std::string_view text) {
   if (read.too_long || read.count == 0) return std::nullopt;
   const std::int32_t hours = read.values[0];
   const std::int32_t minutes = read.count > 1 ? read.values[1] : 0;
-  if (hours > 13 || minutes > 59) return std::nullopt;
+  if (hours < -13 || hours > 13 || minutes < -59 || minutes > 59) return std::nullopt;
   // 64 bits: negating or scaling a 32-bit extreme must not overflow.
   const std::int64_t seconds = std::int64_t{hours} * 3600 + std::int64_t{minutes} * 60;
   return sign == '-' ? -seconds : seconds;

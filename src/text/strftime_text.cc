@@ -23,7 +23,9 @@ constexpr std::size_t kMaxConversionBytes = 4096;
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 
 // One conversion of a pattern: "%" [flags] [width] [modifier] character, as the
-// C library reads it; the character is missing at the end of the pattern.
+// C library reads it; the character is missing at the end of the pattern. The
+// flags must be exactly the library's: a "+" it does not take is a conversion
+// character, and the text after it is not part of the conversion.
 struct Conversion {
   std::size_t length = 0;  // bytes of the pattern it spans
   std::size_t width = 0;   // 0 when none, or more than kMaxFieldWidth + 1
@@ -31,7 +33,7 @@ struct Conversion {
 
 Conversion ReadConversion(const char* percent) {
   const char* p = percent + 1;
-  while (*p != '\0' && std::strchr("_-0^#+", *p) != nullptr) ++p;
+  while (*p != '\0' && std::strchr("_-0^#", *p) != nullptr) ++p;
   std::size_t width = 0;
   for (; IsDigit(*p); ++p) {
     width = std::min(width * 10 + static_cast<std::size_t>(*p - '0'), kMaxFieldWidth + 1);
@@ -45,7 +47,7 @@ bool HasFieldWidth(const char* pattern) {
   for (const char* p = std::strchr(pattern, '%'); p != nullptr;
        p = std::strchr(p + 1, '%')) {
     const char* after_flags = p + 1;
-    while (*after_flags != '\0' && std::strchr("_-0^#+", *after_flags) != nullptr) {
+    while (*after_flags != '\0' && std::strchr("_-0^#", *after_flags) != nullptr) {
       ++after_flags;
     }
     if (IsDigit(*after_flags)) return true;

@@ -98,6 +98,7 @@ TEST(Format, PatternsAndLimits) {
       {"%-5d%%%E", "   17%%E"},
       {"%30p", std::string(28, ' ') + "PM"},
       {"%Y%", "2003%"},
+      {"%5d|%+1%M", "00017|%+103"},  // "+" is no flag: "%M" follows "%+" and "1"
   };
   for (const auto& [wide, expected] : widths) {
     EXPECT_EQ(summer.Format(wide), expected) << wide;

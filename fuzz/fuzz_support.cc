@@ -1,0 +1,89 @@
+#include "fuzz_support.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <array>
+#include <filesystem>
+
+namespace datetimelib::fuzz {
+namespace {
+
+// Runs before the first input, while the process has one thread.
+[[maybe_unused]] const bool kLocalePathSet = [] {
+#ifdef DATETIMELIB_FUZZ_LOCALE_DIR
+  setenv("LOCPATH", DATETIMELIB_FUZZ_LOCALE_DIR, 1);
+#endif
+  setenv("TZ", "America/New_York", 1);
+  return true;
+}();
+
+}  // namespace
+
+void UseLocale(std::uint8_t choice) {
+  static std::array<locale_t, kLocaleCount> locales = [] {
+    std::array<locale_t, kLocaleCount> opened{};
+    for (std::size_t i = 0; i < kLocaleCount; ++i) {
+      opened[i] = newlocale(LC_ALL_MASK, kLocaleNames[i], nullptr);
+      if (opened[i] == nullptr) opened[i] = newlocale(LC_ALL_MASK, "C", nullptr);
+    }
+    return opened;
+  }();
+  uselocale(locales[choice % kLocaleCount]);
+}
+
+void SetTz(std::string_view value) {
+  static std::string buffers[2];
+  static int turn = 0;
+  turn ^= 1;
+  buffers[turn].assign("TZ=").append(
+      value.substr(0, strnlen(value.data(), value.size())));
+  putenv(buffers[turn].data());
+}
+
+bool FieldsInRange(const AdDateTime& value) {
+  const long year = value.GetYear(), month = value.GetMonth(), day = value.GetDay();
+  if (year < 1970 || year > 2038) return false;
+  return year < 2038 || (month == 1 && day <= 18);
+}
+
+const std::string& ScratchFolder() {
+  // The name outlives the string, which is destroyed before the handler runs.
+  static char in_memory[] = "/dev/shm/datetimelib-fuzz-XXXXXX";
+  static char on_disk[] = "/tmp/datetimelib-fuzz-XXXXXX";
+  static char* const name = access("/dev/shm", W_OK) == 0 ? in_memory : on_disk;
+  static const std::string folder = [] {
+    if (mkdtemp(name) == nullptr) Fail("a scratch folder can be made");
+    std::atexit([] {
+      std::error_code ignored;
+      std::filesystem::remove_all(name, ignored);
+    });
+    return std::string(name);
+  }();
+  return folder;
+}
+
+bool WriteFile(const std::string& path, std::string_view bytes) {
+  const int fd = open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0600);
+  if (fd < 0) return false;
+  bool ok = true;
+  while (!bytes.empty()) {
+    const ssize_t written = write(fd, bytes.data(), bytes.size());
+    if (written <= 0) {
+      ok = false;
+      break;
+    }
+    bytes.remove_prefix(static_cast<std::size_t>(written));
+  }
+  return close(fd) == 0 && ok;
+}
+
+}  // namespace datetimelib::fuzz
+
+// glibc 2.36 newlocale does not free the search path it builds from LOCPATH
+// (__argz_add_sep), a few dozen bytes per call; only that allocation is excused.
+extern "C" const char*
+__lsan_default_suppressions() {  // NOLINT(bugprone-reserved-identifier)
+  return "leak:argz_add_sep\n";
+}
