@@ -47,12 +47,13 @@ std::optional<RegularFile> RegularFile::Open(const std::string& path) {
 }
 
 RegularFile::RegularFile(RegularFile&& other) noexcept
-    : descriptor_(std::exchange(other.descriptor_, -1)) {}
+    : descriptor_(std::exchange(other.descriptor_, -1)), identity_(other.identity_) {}
 
 RegularFile& RegularFile::operator=(RegularFile&& other) noexcept {
   if (this != &other) {
     if (descriptor_ >= 0) close(descriptor_);
     descriptor_ = std::exchange(other.descriptor_, -1);
+    identity_ = other.identity_;
   }
   return *this;
 }

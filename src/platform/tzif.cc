@@ -82,17 +82,19 @@ class ByteReader {
 bool ReadHeader(ByteReader* reader, int* version, Counts* counts) {
   std::string_view fixed;
   if (!reader->Take(20, &fixed) || fixed.substr(0, 4) != "TZif") return false;
+  // The C library reads 64-bit data after any version byte but NUL, so a file
+  // of a version yet to come reads as the latest one known.
   switch (fixed[4]) {
     case '\0':
       *version = 1;
       break;
     case '2':
     case '3':
-    case '4':
       *version = fixed[4] - '0';
       break;
     default:
-      return false;
+      *version = 4;
+      break;
   }
   return reader->Count(&counts->isut) && reader->Count(&counts->isstd) &&
          reader->Count(&counts->leap) && reader->Count(&counts->time) &&
@@ -178,14 +180,23 @@ bool ReadBlock(ByteReader* reader, const Counts& counts, std::size_t time_width,
 }
 
 // footer = "\n" rule "\n", the rule holding no newline
+//
+// Read as the C library reads a footer that is not so: a file that ends with
+// its data is refused; a footer that does not start with "\n" is none, the data
+// being kept; one without its closing "\n" loses its last byte instead, which
+// the C library takes for that "\n".
 bool ReadFooter(ByteReader* reader, std::string* footer) {
-  std::string_view newline;
-  if (!reader->Take(1, &newline) || newline != "\n") return false;
   std::string_view rest;
   reader->Take(reader->Remaining(), &rest);
+  if (rest.empty()) return false;
+  if (rest.front() != '\n') {
+    footer->clear();
+    return true;
+  }
+  rest.remove_prefix(1);
+  if (rest.empty()) return false;
   const std::size_t end = rest.find('\n');
-  if (end == std::string_view::npos) return false;
-  footer->assign(rest.substr(0, end));
+  footer->assign(rest.substr(0, end != std::string_view::npos ? end : rest.size() - 1));
   return true;
 }
 

@@ -34,7 +34,7 @@ struct TzifType {
 };
 
 struct Tzif {
-  int version = 1;  // 1 to 4
+  int version = 1;  // 1 to 4; 4 also for versions this reader does not know
   // Transition instants, strictly ascending, in seconds since 1970-01-01
   // 00:00:00 UTC, and for each the index into `types` of the time that begins
   // there. From the 64-bit data for version 2 and later.
@@ -49,7 +49,9 @@ struct Tzif {
 };
 
 // Reads a whole zone file. Bytes after the data (version 1) or after the footer
-// (later versions) are ignored, as the C library ignores them.
+// (later versions) are ignored, as the C library ignores them. A version byte
+// other than NUL, "2" and "3" reads as version 4, and a malformed footer as the
+// C library reads it (see ReadFooter).
 std::optional<Tzif> ParseTzif(std::string_view bytes);
 
 }  // namespace datetimelib::platform

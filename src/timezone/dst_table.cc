@@ -1,5 +1,4 @@
 // Daylight-saving dates from the table file dst_dates.dat, else from the rule.
-#include <cstring>
 #include <optional>
 #include <string>
 #include <utility>
@@ -9,76 +8,12 @@
 #include "platform/zone_source.h"
 #include "text/canonical_text.h"
 #include "timezone/rule_dates.h"
+#include "timezone/table_lines.h"
 
 namespace datetimelib {
 namespace {
 
 constexpr char kTableName[] = "dst_dates.dat";
-
-// Longer than any entry a person writes; longer lines are passed over, which
-// keeps the memory of a call bounded whatever the file holds.
-constexpr std::size_t kMaxLineBytes = 4096;
-
-// The lines of a file, each without its "\n" or "\r\n". Lines longer than
-// kMaxLineBytes or holding a NUL byte (which no entry can hold) are passed over
-// whole. A read error ends the file.
-class LineReader {
- public:
-  explicit LineReader(platform::RegularFile file) : file_(std::move(file)) {}
-
-  bool Next(std::string* line) {
-    line->clear();
-    bool seen = false;         // a byte of this line has been read
-    bool passed_over = false;  // too long, or holds a NUL byte
-    for (;;) {
-      if (begin_ == end_ && !Fill()) {
-        // The last line needs no line end.
-        return seen && !passed_over && !failed_ && Finish(line);
-      }
-      const char* chunk = buffer_ + begin_;
-      const std::size_t available = end_ - begin_;
-      const void* newline = std::memchr(chunk, '\n', available);
-      const std::size_t length =
-          newline != nullptr
-              ? static_cast<std::size_t>(static_cast<const char*>(newline) - chunk)
-              : available;
-      seen = true;
-      if (!passed_over && (std::memchr(chunk, '\0', length) != nullptr ||
-                           line->size() + length > kMaxLineBytes)) {
-        passed_over = true;
-        line->clear();
-      }
-      if (!passed_over) line->append(chunk, length);
-      begin_ += length;
-      if (newline == nullptr) continue;
-      ++begin_;
-      if (!passed_over) return Finish(line);
-      seen = false;
-      passed_over = false;
-    }
-  }
-
- private:
-  static bool Finish(std::string* line) {
-    if (!line->empty() && line->back() == '\r') line->pop_back();
-    return true;
-  }
-
-  bool Fill() {
-    if (failed_) return false;
-    const long count = file_.Read(buffer_, sizeof buffer_);
-    failed_ = count < 0;
-    begin_ = 0;
-    end_ = count > 0 ? static_cast<std::size_t>(count) : 0;
-    return count > 0;
-  }
-
-  platform::RegularFile file_;
-  char buffer_[4096];
-  std::size_t begin_ = 0;  // the unread bytes are buffer_[begin_, end_)
-  std::size_t end_ = 0;
-  bool failed_ = false;
-};
 
 // entry = start-text ";" end-text   ; split at the first ";", nothing trimmed
 //
@@ -102,7 +37,7 @@ bool ReadEntry(const std::string& line, int year, std::string* start, std::strin
 bool ReadTable(const std::string& path, int year, std::string* start, std::string* end) {
   std::optional<platform::RegularFile> file = platform::RegularFile::Open(path);
   if (!file) return false;
-  LineReader lines(std::move(*file));
+  TableLines lines(std::move(*file));
   std::string line;
   while (lines.Next(&line)) {
     if (ReadEntry(line, year, start, end)) return true;

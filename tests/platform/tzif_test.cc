@@ -39,7 +39,6 @@ TEST(ParseTzif, ReadsVersion2AndRefusesMalformedData) {
     void (*corrupt)(TzifParts*);
   } cases[] = {
       // Header.
-      {"version 5", [](TzifParts* p) { p->version = '5'; }},
       {"no types, nor anything else", [](TzifParts* p) { *p = TzifParts{}; }},
       {"time count beyond the data", [](TzifParts* p) { p->time_count_override = 3; }},
       {"time count 2^32 - 1", [](TzifParts* p) { p->time_count_override = 0xffffffff; }},
@@ -51,9 +50,9 @@ TEST(ParseTzif, ReadsVersion2AndRefusesMalformedData) {
       {"designation index = designation count",
        [](TzifParts* p) { p->types[1].designation = 8; }},
       {"designation without NUL", [](TzifParts* p) { p->designations = "XSTXDT"; }},
-      // Footer.
-      {"footer without closing newline", [](TzifParts* p) { p->footer = "\nUTC0"; }},
+      // Footer: none at all, or its "\n" alone.
       {"no footer", [](TzifParts* p) { p->footer = ""; }},
+      {"a footer of one newline", [](TzifParts* p) { p->footer = "\n"; }},
   };
   for (const auto& c : cases) {
     TzifParts parts = GoodParts();
@@ -61,6 +60,34 @@ TEST(ParseTzif, ReadsVersion2AndRefusesMalformedData) {
     EXPECT_FALSE(ParseTzif(TzifBytes(parts)).has_value()) << c.fault;
   }
   EXPECT_FALSE(ParseTzif("TZjf" + TzifBytes(GoodParts()).substr(4)).has_value());
+}
+
+// What the C library makes of a footer that is not "\n" rule "\n", and of a
+// version it does not know: the data is read all the same.
+TEST(ParseTzif, ReadsOddFootersAndLaterVersionsAsTheCLibrary) {
+  const struct {
+    char version;
+    const char* footer;
+    int read_version;
+    const char* read_footer;
+  } cases[] = {
+      {'2', "\nUTC0\nmore\n", 2, "UTC0"},
+      {'3', "\nUTC0", 3, "UTC"},  // the last byte is taken for the "\n"
+      {'2', "\nX", 2, ""},
+      {'2', "XUTC0\n", 2, ""},  // no "\n" first: no footer
+      {'5', "\nUTC0\n", 4, "UTC0"},
+      {'x', "\nUTC0\n", 4, "UTC0"},
+  };
+  for (const auto& c : cases) {
+    TzifParts parts = GoodParts();
+    parts.version = c.version;
+    parts.footer = c.footer;
+    const auto zone = ParseTzif(TzifBytes(parts));
+    ASSERT_TRUE(zone.has_value()) << c.version << " " << c.footer;
+    EXPECT_EQ(zone->version, c.read_version);
+    EXPECT_EQ(zone->footer, c.read_footer);
+    EXPECT_EQ(zone->transition_times, GoodParts().times);
+  }
 }
 
 }  // namespace

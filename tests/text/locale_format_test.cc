@@ -99,4 +99,33 @@ TEST(FormatInLocale, DefaultLocales) {
   std::setlocale(LC_ALL, "C");
 }
 
+// An identifier that names no locale, or one that is not installed, writes as
+// "C"; so do the default locales when the environment names garbage. LOCPATH,
+// set with the compiled test locales, keeps ru_RU, zh_CN and ko_KR out of reach.
+TEST(FormatInLocale, UnknownAndMissingLocalesWriteAsC) {
+  DATETIMELIB_NEED_TEST_LOCALES();
+  TzGuard tz("UTC");
+  const AdDateTime may17(AdTime(1053180189));  // 2003-05-17 14:03:09
+  constexpr const char* kC = "05/17/03 14:03:09";
+  const std::string long_name(4096, 'x');
+  const char* const garbage[] = {
+      "xx_XX.UTF-8",      "de_DE.NOSUCHCODESET", "../../../../etc/passwd", "/dev/zero",
+      "\xFF\xFE\x80",     "C.\xC0\xAF",          long_name.c_str(),        "=",
+      "de_XX.UTF-8@euro",
+  };
+  for (const char* name : garbage) {
+    SCOPED_TRACE(testing::PrintToString(name));
+    const EnvGuard lc_all("LC_ALL", name);
+    const EnvGuard lang("LANG", name);
+    for (const std::uint32_t id : {0u, 1u, 999999u, 0xFFFFFFFFu, 1024u + 0x10000u, 1049u,
+                                   2052u, 1042u, 1024u, 2048u}) {
+      EXPECT_EQ(may17.Format(AdDateTime::dateAndTime, id), kC) << id;
+    }
+    // The second read of a text with a fraction is in "C" too.
+    AdDateTime read;
+    EXPECT_EQ(read.ParseDateTime("2003-05-17 14:03:09.5"), 1);
+    EXPECT_EQ(read.GetCTime().GetTime(), 1053180189);
+  }
+}
+
 }  // namespace

@@ -2,6 +2,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <cstdio>
 #include <string>
 #include <tuple>
 
@@ -97,6 +98,36 @@ TEST_F(DstTableTest, NoTable) {
   for (const char* not_a_file : {"directory", "fifo", "device"}) {
     EXPECT_EQ(Get(2005, folder_.Path(not_a_file).c_str()), Computed(2005)) << not_a_file;
   }
+}
+
+// Tables that hold nothing readable give the rule's dates, whatever their size.
+TEST_F(DstTableTest, TablesWithoutEntries) {
+  const struct {
+    const char* name;
+    std::string content;
+  } cases[] = {
+      {"empty", ""},
+      {"NUL bytes only", std::string(1 << 20, '\0')},
+      {"one line of 8 MB", std::string(8 << 20, '7')},
+      {"an entry cut by a NUL byte",
+       std::string("2005-04-03 01:59:59;2005-10-30\0 02:00:00", 40)},
+  };
+  for (const auto& c : cases) {
+    folder_.Write("dst_dates.dat", c.content);
+    EXPECT_EQ(Get(2005), Computed(2005)) << c.name;
+  }
+  // A regular file whose first read fails (this process's memory at address 0),
+  // which no user, root included, can read.
+  ASSERT_EQ(remove(folder_.Path("dst_dates.dat").c_str()), 0);
+  ASSERT_EQ(symlink("/proc/self/mem", folder_.Path("dst_dates.dat").c_str()), 0);
+  EXPECT_EQ(Get(2005), Computed(2005)) << "read error";
+  // A file that cannot be opened reads as absent. Mode 000 does not stop root,
+  // who reads the table.
+  ASSERT_EQ(remove(folder_.Path("dst_dates.dat").c_str()), 0);
+  folder_.Write("dst_dates.dat", "2005-04-10 01:59:59;2005-10-23 02:00:00\n");
+  ASSERT_EQ(chmod(folder_.Path("dst_dates.dat").c_str(), 0), 0);
+  const Dates table(1, "2005-04-10 01:59:59", "2005-10-23 02:00:00");
+  EXPECT_EQ(Get(2005), geteuid() == 0 ? table : Computed(2005)) << "mode 000";
 }
 
 // Read afresh at every call; without daylight saving, 0 and both texts emptied
