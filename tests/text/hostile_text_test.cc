@@ -282,9 +282,9 @@ TEST(HostileText, NumbersOfHundredsOfDigits) {
 
 // Signs inside the numbers of the compact time and its offset. Each number is
 // read as the time's numbers are: blanks, then a sign of its own, then digits,
-// and a ":" directly after it; what follows the last number is ignored. Only the
-// upper bounds of the offset are tested, on the numbers as read, before the
-// offset's own sign applies.
+// and a ":" directly after it; what follows the last number is ignored. The
+// offset's numbers, as read, lie within 13 hours and 59 minutes either way
+// before the offset's own sign applies.
 TEST(HostileText, SignsInsideCompactNumbers) {
   TzGuard tz("UTC");
   FixedNow now(kNow);
@@ -300,9 +300,11 @@ TEST(HostileText, SignsInsideCompactNumbers) {
       {"05-Jan-2003.10:00UTC+1: 30", "2003-01-05 11:30:00"},
       {"05-Jan-2003.10:00UTC+1 :30", "2003-01-05 11:00:00"},
       {"05-Jan-2003.10:00UTC+1:-", "2003-01-05 11:00:00"},
-      {"05-Jan-2003.10:00UTC+1:-60", "2003-01-05 10:00:00"},
-      {"05-Jan-2003.10:00UTC--14", "2003-01-06 00:00:00"},  // -14 is below 13
-      {"05-Jan-2003.10:00UTC+-14:-59", "2003-01-04 19:01:00"},
+      {"05-Jan-2003.10:00UTC--13:-59", "2003-01-05 23:59:00"},
+      {"05-Jan-2003.10:00UTC+-13:-59", "2003-01-04 20:01:00"},
+      {"05-Jan-2003.10:00UTC+1:-60", kRefused},
+      {"05-Jan-2003.10:00UTC--14", kRefused},
+      {"05-Jan-2003.10:00UTC+-14:-59", kRefused},
       {"05-Jan-2003.10:00UTC+2UTC+3", "2003-01-05 12:00:00"},
       {"05-Jan-2003.10:00UTC-+14", kRefused},
       {"05-Jan-2003.10:00UTC+1:+60", kRefused},
