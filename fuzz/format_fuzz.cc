@@ -17,12 +17,13 @@ namespace {
 using datetimelib::fuzz::Check;
 
 // What strftime writes for the pattern, given room for every conversion's
-// width (none here exceeds 999) and any locale's longest name.
+// width (none here exceeds 999; glibc pads "%z" twice, sign and digits) and any
+// locale's longest name.
 std::string Strftime(const char* pattern, const std::tm& fields) {
   const std::size_t length = std::strlen(pattern);
   std::size_t conversions = 0;
   for (const char* p = pattern; (p = std::strchr(p, '%')) != nullptr; ++p) ++conversions;
-  const std::size_t size = length + conversions * (999 + 256) + 1;
+  const std::size_t size = length + conversions * (2 * 999 + 256) + 1;
   const std::unique_ptr<char[]> buffer(new char[size]);
   return std::string(buffer.get(), std::strftime(buffer.get(), size, pattern, &fields));
 }

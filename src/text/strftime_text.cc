@@ -17,7 +17,8 @@ constexpr std::size_t kCanonicalLength = 19;  // "YYYY-MM-DD HH:MM:SS"
 // conversion is written as it stands in the pattern.
 constexpr std::size_t kMaxFieldWidth = 1024;
 
-// No conversion of any locale writes this many bytes before its padding.
+// No conversion of any locale writes this many bytes beyond its width (glibc
+// pads "%z" twice, the sign and then the digits to the width each).
 constexpr std::size_t kMaxConversionBytes = 4096;
 
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
