@@ -243,7 +243,8 @@ void FieldsAndArithmetic(const AdDateTime& value, int i, Transcript* out) {
 
 void ZoneQuestions(const std::string& table_folder, int i, Transcript* out) {
   out->push_back(std::to_string(AdDateTime::GetGMTOffset()) + " " +
-                 std::to_string(AdDateTime::UsesDST()));
+                 std::to_string(AdDateTime::UsesDST()) + " " +
+                 Describe(AdDateTime::GetTickCount()));
   const int year = 1969 + (i * 7) % 72;
   std::string start, end;
   const int generated = AdDateTime::GenerateDSTDates(year, start, end);
