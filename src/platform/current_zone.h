@@ -7,7 +7,8 @@
 // /etc/localtime when TZ is unset) is seen within a second: its identity is
 // checked at most once a second. TZDIR is read when the zone is compiled, as the
 // C library reads it. Each thread holds at most one compiled zone, however often
-// TZ changes.
+// TZ changes, and keeps it until the thread has run its thread_local destructors,
+// which may therefore call in (as may exit handlers on the main thread).
 #ifndef DATETIMELIB_PLATFORM_CURRENT_ZONE_H_
 #define DATETIMELIB_PLATFORM_CURRENT_ZONE_H_
 
