@@ -40,10 +40,10 @@ bool SameLocalTime(const AdDateTime& back, const AdDateTime& value) {
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   datetimelib::fuzz::Input input(data, size);
-  const std::uint8_t locale = input.Byte() % datetimelib::fuzz::kLocaleCount;
-  const std::uint8_t zone = input.Byte() % (sizeof kZones / sizeof kZones[0]);
+  const std::size_t locale = input.Byte() % datetimelib::fuzz::kLocaleCount;
+  const std::size_t zone = input.Byte() % (sizeof kZones / sizeof kZones[0]);
   const std::int32_t count = static_cast<std::int32_t>(input.Word() & 0x7fffffff);
-  datetimelib::fuzz::UseLocale(locale);
+  datetimelib::fuzz::UseLocale(static_cast<std::uint8_t>(locale));
   datetimelib::fuzz::SetTz(kZones[zone]);
   const std::string label = std::string(kZones[zone]) + " " + std::to_string(count);
 
