@@ -33,6 +33,22 @@ inline std::int64_t UtcCount(int year, int month, int day, int hour = 0, int min
   return static_cast<std::int64_t>(timegm(&fields));
 }
 
+// A valid value with the count 777 and the kept text "kept", to show what a
+// call replaces and what it leaves.
+inline constexpr std::int32_t kDirtyCount = 777;
+inline AdDateTime Dirty() {
+  AdDateTime value{AdTime(kDirtyCount)};
+  value.ParseDateTime("kept");
+  value.SetStatus(AdDateTime::valid);
+  return value;
+}
+
+// The text a value keeps, shown by Format only for outOfRange.
+inline std::string KeptText(AdDateTime value) {
+  value.SetStatus(AdDateTime::outOfRange);
+  return value.Format("%Y-%m-%d %H:%M:%S");
+}
+
 }  // namespace datetimelib::testing
 
 #endif  // DATETIMELIB_TESTS_SUPPORT_VALUE_TEXT_H_

@@ -10,7 +10,9 @@
 
 namespace {
 
+using datetimelib::testing::Dirty;
 using datetimelib::testing::FixedNow;
+using datetimelib::testing::KeptText;
 using datetimelib::testing::TzGuard;
 using datetimelib::testing::UtcCount;
 
@@ -23,20 +25,6 @@ const std::int64_t kWednesday = UtcCount(2003, 1, 8, 15);
 
 AdDateTime At(std::int64_t count) {
   return AdDateTime(AdTime(static_cast<std::int32_t>(count)));
-}
-
-// A `valid` value with the count 777 and the kept text "kept", to show what a
-// call replaces and what it leaves.
-AdDateTime Dirty() {
-  AdDateTime value(AdTime(777));
-  value.ParseDateTime("kept");
-  value.SetStatus(AdDateTime::valid);
-  return value;
-}
-
-std::string KeptText(AdDateTime value) {
-  value.SetStatus(AdDateTime::outOfRange);  // the one status Format shows it for
-  return value.Format(kCanonical);
 }
 
 // The canonical text, local or UTC, that `text` gives, or "invalid".

@@ -15,30 +15,18 @@
 
 namespace {
 
+using datetimelib::testing::Dirty;
 using datetimelib::testing::FixedNow;
+using datetimelib::testing::KeptText;
 using datetimelib::testing::ThreadLocale;
 using datetimelib::testing::TzGuard;
 
 constexpr const char* kCanonical = "%Y-%m-%d %H:%M:%S";
 constexpr const char* kRefused = "refused";
-constexpr int kCountBefore = 777;
+constexpr int kCountBefore = datetimelib::testing::kDirtyCount;
 
 // Wednesday 2003-01-08 10:00:00 UTC, the now of compact texts without a date.
 const std::int64_t kNow = datetimelib::testing::UtcCount(2003, 1, 8, 10);
-
-// A valid value with the count 777 and the kept text "kept", to show what a
-// call replaces and what it leaves.
-AdDateTime Dirty() {
-  AdDateTime value{AdTime(kCountBefore)};
-  value.ParseDateTime("kept");
-  value.SetStatus(AdDateTime::valid);
-  return value;
-}
-
-std::string KeptText(AdDateTime value) {
-  value.SetStatus(AdDateTime::outOfRange);  // the one status Format shows it for
-  return value.Format(kCanonical);
-}
 
 // The canonical UTC text that ParseTolvaneDateTime reads, or kRefused after
 // checking that a refusal left the count and the kept text alone.
