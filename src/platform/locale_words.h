@@ -30,6 +30,13 @@ struct LocaleWords {
 // The words of the time category of `locale`, which must not be LC_GLOBAL_LOCALE.
 LocaleWords ReadLocaleWords(locale_t locale);
 
+// The C library's texts that a locale's words and its case folding come from:
+// every item ReadLocaleWords reads, and the name and codeset of the character
+// types. Two locales with the same texts read and fold alike, so what was
+// compiled from one serves the other.
+std::vector<std::string> LocaleSourceTexts(locale_t locale);
+bool SameLocaleSourceTexts(const std::vector<std::string>& texts, locale_t locale);
+
 }  // namespace datetimelib::platform
 
 #endif  // DATETIMELIB_PLATFORM_LOCALE_WORDS_H_

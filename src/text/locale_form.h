@@ -91,6 +91,10 @@ class LocaleVocabulary {
 
   bool has_am_pm() const { return !am_pm_.empty(); }
 
+  // Reads texts with `folder` from now on: one of a locale with the same
+  // character types as the one the names were lowered with.
+  void set_folder(const platform::LocaleCase& folder) { folder_ = folder; }
+
   // The longest name of the list at `text[position]`: its number, and the bytes
   // it takes in `*length`; -1 when none is there.
   int MatchMonth(std::string_view text, std::size_t position, std::size_t* length) const;

@@ -1,10 +1,13 @@
 #include "text/locale_reader.h"
 
 #include <algorithm>
+#include <memory>
 #include <string>
+#include <vector>
 
 #include "platform/civil.h"
 #include "platform/locale_case.h"
+#include "platform/thread_state.h"
 
 namespace datetimelib {
 namespace {
@@ -178,11 +181,35 @@ bool ReadWithForms(std::string_view text, const LocaleForms& forms,
   return false;
 }
 
+namespace {
+
+// A locale's reading forms and vocabulary, and the texts they were compiled
+// from. Compiling costs some microseconds, reading a text far less, so each
+// thread keeps those of the locale it read in last.
+struct CompiledLocale {
+  std::vector<std::string> source_texts;
+  LocaleForms forms;
+  LocaleVocabulary vocabulary;
+};
+
+}  // namespace
+
 bool ReadInLocale(std::string_view text, locale_t locale, DateTimeFields* out) {
   if (locale == nullptr) return false;
-  const platform::LocaleWords words = platform::ReadLocaleWords(locale);
-  const LocaleVocabulary vocabulary(words, platform::LocaleCase(locale));
-  return ReadWithForms(text, BuildLocaleForms(words), vocabulary, out);
+  std::shared_ptr<void>& slot = platform::ThisThreadState().locale_forms;
+  auto* compiled = static_cast<CompiledLocale*>(slot.get());
+  if (compiled == nullptr ||
+      !platform::SameLocaleSourceTexts(compiled->source_texts, locale)) {
+    const platform::LocaleWords words = platform::ReadLocaleWords(locale);
+    auto fresh = std::make_shared<CompiledLocale>(
+        CompiledLocale{platform::LocaleSourceTexts(locale), BuildLocaleForms(words),
+                       LocaleVocabulary(words, platform::LocaleCase(locale))});
+    compiled = fresh.get();
+    slot = std::move(fresh);
+  }
+  // Folding goes through this call's locale: the one compiled from may be gone.
+  compiled->vocabulary.set_folder(platform::LocaleCase(locale));
+  return ReadWithForms(text, compiled->forms, compiled->vocabulary, out);
 }
 
 }  // namespace datetimelib

@@ -118,4 +118,28 @@ TEST(ReadInLocale, Forms) {
   }
 }
 
+// A thread keeps the forms of the locale it read in last; a read in another
+// locale, often opened where the last one was freed, never gets them.
+TEST(ReadInLocale, ForgetsTheLastLocaleForAnother) {
+  DATETIMELIB_NEED_TEST_LOCALES();
+  const struct {
+    std::uint32_t locale;
+    const char* text;
+    const char* fields;
+  } in_turn[] = {
+      {kDeDe, "17. März 2003", "2003-03-17 00:00:00"},
+      {kFrFr, "17. März 2003", "refused"},
+      {kFrFr, "17 mars 2003", "2003-03-17 00:00:00"},
+      {kDeDe, "17 mars 2003", "refused"},
+      {kEnUs, "2:30 PM", "1899-12-30 14:30:00"},
+      {kDeDe, "2:30 PM", "refused"},
+      {kJaJp, "2:30 午後", "1899-12-30 14:30:00"},
+      {kEnUs, "2:30 午後", "refused"},
+  };
+  for (const auto& step : in_turn) {
+    EXPECT_EQ(Read(step.locale, step.text), step.fields)
+        << "locale " << step.locale << ": " << step.text;
+  }
+}
+
 }  // namespace
