@@ -271,6 +271,9 @@ class DATETIMELIB_API AdDateTime {
   // locale, in its encoding). Bits other than `timeOnly` and `dateOnly` are
   // ignored; both together write the date and the time.
   // An unknown identifier, or a locale that is not installed, writes as "C".
+  // Each thread keeps the last few locales it opened (a change of LOCPATH is
+  // seen at the next call; locale files replaced while the process runs are
+  // not, as the C library's own locale archive is not).
   // Example: 2003-05-17 14:03:09 gives "05/17/2003 02:03:09 PM" in 1033,
   // "17.05.2003" with `dateOnly` in 1031, and "14:03:09" with `timeOnly` in 127.
   // Note: `ParseDateTime` reads this text back on a thread whose locale is the

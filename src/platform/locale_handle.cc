@@ -1,10 +1,14 @@
 #include "platform/locale_handle.h"
 
+#include <algorithm>
 #include <cstdlib>
+#include <optional>
 #include <string>
 #include <utility>
+#include <vector>
 
 #include "platform/locale_names.h"
+#include "platform/thread_state.h"
 
 namespace datetimelib::platform {
 namespace {
@@ -23,10 +27,50 @@ const char* UserLocaleName() {
   return "C";
 }
 
+// A locale opened by name, or the failure to open it (a null locale), under the
+// LOCPATH it was looked for in.
+struct OpenedLocale {
+  OpenedLocale(std::string name_, std::optional<std::string> locale_path_)
+      : name(std::move(name_)),
+        locale_path(std::move(locale_path_)),
+        locale(newlocale(kCategories, name.c_str(), kNoLocale)) {}
+  OpenedLocale(const OpenedLocale&) = delete;
+  OpenedLocale& operator=(const OpenedLocale&) = delete;
+  ~OpenedLocale() {
+    if (locale != kNoLocale) freelocale(locale);
+  }
+
+  const std::string name;
+  const std::optional<std::string> locale_path;
+  const locale_t locale;
+};
+
+// The thread's last few, most recently used first.
+using OpenedLocales = std::vector<std::shared_ptr<const OpenedLocale>>;
+constexpr std::size_t kOpenedLocalesKept = 4;
+
+std::optional<std::string> LocalePath() {
+  const char* value = std::getenv("LOCPATH");
+  return value != nullptr ? std::optional<std::string>(value) : std::nullopt;
+}
+
 }  // namespace
 
 LocaleHandle LocaleHandle::OpenNamed(const char* name) {
-  return LocaleHandle(newlocale(kCategories, name, kNoLocale), true);
+  std::shared_ptr<void>& slot = ThisThreadState().opened_locales;
+  if (!slot) slot = std::make_shared<OpenedLocales>();
+  OpenedLocales& opened = *static_cast<OpenedLocales*>(slot.get());
+  const std::optional<std::string> locale_path = LocalePath();
+  auto found = std::find_if(opened.begin(), opened.end(), [&](const auto& entry) {
+    return entry->name == name && entry->locale_path == locale_path;
+  });
+  if (found == opened.end()) {
+    if (opened.size() == kOpenedLocalesKept) opened.pop_back();
+    opened.push_back(std::make_shared<const OpenedLocale>(name, locale_path));
+    found = opened.end() - 1;
+  }
+  std::rotate(opened.begin(), found, found + 1);
+  return LocaleHandle(opened.front()->locale, opened.front());
 }
 
 LocaleHandle LocaleHandle::OrInvariant(LocaleHandle handle) {
@@ -70,13 +114,15 @@ LocaleHandle LocaleHandle::ForIdentifier(std::uint32_t identifier) {
 
 LocaleHandle::LocaleHandle(LocaleHandle&& other) noexcept
     : locale_(std::exchange(other.locale_, kNoLocale)),
-      owned_(std::exchange(other.owned_, false)) {}
+      owned_(std::exchange(other.owned_, false)),
+      keeper_(std::move(other.keeper_)) {}
 
 LocaleHandle& LocaleHandle::operator=(LocaleHandle&& other) noexcept {
   if (this != &other) {
     if (owned_ && locale_ != kNoLocale) freelocale(locale_);
     locale_ = std::exchange(other.locale_, kNoLocale);
     owned_ = std::exchange(other.owned_, false);
+    keeper_ = std::move(other.keeper_);
   }
   return *this;
 }

@@ -11,6 +11,8 @@
 #include <locale.h>
 
 #include <cstdint>
+#include <memory>
+#include <utility>
 
 namespace datetimelib::platform {
 
@@ -49,14 +51,20 @@ class LocaleHandle {
 
  private:
   LocaleHandle(locale_t locale, bool owned) : locale_(locale), owned_(owned) {}
+  LocaleHandle(locale_t locale, std::shared_ptr<const void> keeper)
+      : locale_(locale), owned_(false), keeper_(std::move(keeper)) {}
 
   // Opens the time and character-type categories of `name`; null on failure.
+  // Each thread keeps the last few it opened, with the LOCPATH they were opened
+  // under, and shares them with the handles it gives: opening a locale reads
+  // its files, which takes far longer than what a call does with it.
   static LocaleHandle OpenNamed(const char* name);
   // `handle`, or "C" when it holds nothing.
   static LocaleHandle OrInvariant(LocaleHandle handle);
 
   locale_t locale_;
-  bool owned_;  // whether this handle frees the locale
+  bool owned_;                          // whether this handle frees the locale
+  std::shared_ptr<const void> keeper_;  // what keeps a shared locale open
 };
 
 }  // namespace datetimelib::platform

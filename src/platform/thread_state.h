@@ -1,6 +1,6 @@
-// What one thread keeps between calls: its compiled zone and the locale reader's
-// compiled forms. Nothing is shared between threads, so the read paths take no
-// lock.
+// What one thread keeps between calls: its compiled zone, the locales it opened
+// by name and the locale reader's compiled forms. Nothing is shared between threads, so
+// the read paths take no lock.
 //
 // The state lives until the thread has run the destructors of its thread_local
 // objects, which may therefore call in (as may exit handlers on the main
@@ -33,6 +33,9 @@ struct ThreadState {
   // The forms of the locale read in last, of a type this layer does not know
   // (text/locale_reader.cc).
   std::shared_ptr<void> locale_forms;
+
+  // The locales opened by name last (locale_handle.cc).
+  std::shared_ptr<void> opened_locales;
 };
 
 // The thread's state lives on the heap behind a pointer in initial-exec TLS: a

@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 
 #include <clocale>
+#include <cstdlib>
 #include <string>
 #include <utility>
 
@@ -125,6 +126,35 @@ TEST(FormatInLocale, UnknownAndMissingLocalesWriteAsC) {
     AdDateTime read;
     EXPECT_EQ(read.ParseDateTime("2003-05-17 14:03:09.5"), 1);
     EXPECT_EQ(read.GetCTime().GetTime(), 1053180189);
+  }
+}
+
+// A thread keeps the locales it opened, each with the LOCPATH it was found
+// under: a LOCPATH that no longer holds a locale, or holds it again, is seen at
+// the next call, as are more locales than the thread keeps.
+TEST(FormatInLocale, FollowsLocalePath) {
+  DATETIMELIB_NEED_TEST_LOCALES();
+  TzGuard tz("UTC");
+  const AdDateTime may17(AdTime(1053180189));  // 2003-05-17 14:03:09
+  const char* const test_locales = std::getenv("LOCPATH");
+  const struct {
+    const char* locale_path;
+    std::uint32_t id;
+    const char* text;
+  } in_turn[] = {
+      {test_locales, 1031, "17.05.2003 14:03:09"},
+      {"/nonexistent", 1031, "05/17/03 14:03:09"},
+      {test_locales, 1031, "17.05.2003 14:03:09"},
+      {test_locales, 1036, "17/05/2003 14:03:09"},
+      {test_locales, 1033, "05/17/2003 02:03:09 PM"},
+      {test_locales, 2057, "17/05/03 14:03:09"},
+      {test_locales, 1041, "2003年05月17日 14時03分09秒"},
+      {test_locales, 1031, "17.05.2003 14:03:09"},
+  };
+  for (const auto& step : in_turn) {
+    const EnvGuard locale_path("LOCPATH", step.locale_path);
+    EXPECT_EQ(may17.Format(AdDateTime::dateAndTime, step.id), step.text)
+        << step.id << " under " << step.locale_path;
   }
 }
 
