@@ -6,9 +6,6 @@
 
 namespace datetimelib::platform {
 
-__attribute__((tls_model("initial-exec"))) thread_local ThreadState* this_thread_state =
-    nullptr;
-
 namespace {
 
 // The state is freed by the destructor of a pthread key, not by a thread_local
