@@ -192,17 +192,31 @@ void ZoneTimeline::BuildFromDefaultRules(const PosixRule& rule, const Tzif& file
   if (!file.transition_times.empty()) FollowFooterFrom(file.footer, last_transition);
 }
 
-// Bucket b of the index holds the last of `starts` at or before the bucket's
-// first second.
+// Bucket b of the index holds the last of `starts` (ascending) at or before the
+// bucket's first second. Each start's first bucket is found by arithmetic and
+// the buckets between two starts are filled at once, so compiling a zone costs
+// a pass over its periods and a fill, not a comparison per bucket.
 static std::vector<std::uint16_t> BucketIndex(const std::vector<std::int64_t>& starts,
                                               int shift, std::int64_t from,
                                               std::int64_t to) {
-  std::vector<std::uint16_t> index(static_cast<std::size_t>(((to - from) >> shift) + 1));
-  std::size_t period = 0;
-  for (std::size_t bucket = 0; bucket < index.size(); ++bucket) {
-    const std::int64_t first_second = from + (static_cast<std::int64_t>(bucket) << shift);
-    while (period + 1 < starts.size() && starts[period + 1] <= first_second) ++period;
-    index[bucket] = static_cast<std::uint16_t>(period);
+  const std::size_t buckets = static_cast<std::size_t>(((to - from) >> shift) + 1);
+  // The first bucket whose first second is at or after `start`.
+  const auto first_bucket = [&](std::int64_t start) -> std::size_t {
+    if (start <= from) return 0;
+    if (start > to) return buckets;
+    const std::int64_t rounded_up =
+        (start - from + (std::int64_t{1} << shift) - 1) >> shift;
+    return std::min(buckets, static_cast<std::size_t>(rounded_up));
+  };
+  std::vector<std::uint16_t> index(buckets);
+  for (std::size_t period = 0; period < starts.size(); ++period) {
+    const std::size_t begin = period == 0 ? 0 : first_bucket(starts[period]);
+    const std::size_t end =
+        period + 1 == starts.size() ? buckets : first_bucket(starts[period + 1]);
+    if (begin >= end) continue;
+    std::fill(index.begin() + static_cast<std::ptrdiff_t>(begin),
+              index.begin() + static_cast<std::ptrdiff_t>(end),
+              static_cast<std::uint16_t>(period));
   }
   return index;
 }
