@@ -221,6 +221,15 @@ static std::vector<std::uint16_t> BucketIndex(const std::vector<std::int64_t>& s
   return index;
 }
 
+// The local time of an instant. A zone file may place a transition anywhere in
+// 64 bits; its local time saturates rather than wraps, which moves only
+// instants that no 32-bit count comes near.
+static std::int64_t LocalTimeOf(std::int64_t instant, std::int32_t utc_offset) {
+  if (utc_offset > 0 && instant > INT64_MAX - utc_offset) return INT64_MAX;
+  if (utc_offset < 0 && instant < INT64_MIN - utc_offset) return INT64_MIN;
+  return instant + utc_offset;
+}
+
 void ZoneTimeline::Finish() {
   offset_span_ = 1;
   for (const LocalType& type : types_) {
@@ -232,8 +241,9 @@ void ZoneTimeline::Finish() {
   local_ends_.resize(starts_.size());
   for (std::size_t i = 0; i < starts_.size(); ++i) {
     const std::int32_t offset = types_[period_types_[i]].utc_offset;
-    local_starts_[i] = i == 0 ? INT64_MIN : starts_[i] + offset;
-    local_ends_[i] = i + 1 == starts_.size() ? INT64_MAX : starts_[i + 1] + offset;
+    local_starts_[i] = i == 0 ? INT64_MIN : LocalTimeOf(starts_[i], offset);
+    local_ends_[i] =
+        i + 1 == starts_.size() ? INT64_MAX : LocalTimeOf(starts_[i + 1], offset);
     if (i > 0 && local_starts_[i] <= local_starts_[i - 1]) local_starts_ascend_ = false;
   }
   if (starts_.size() < UINT16_MAX) {
