@@ -17,9 +17,10 @@ constexpr std::size_t kCanonicalLength = 19;  // "YYYY-MM-DD HH:MM:SS"
 // conversion is written as it stands in the pattern.
 constexpr std::size_t kMaxFieldWidth = 1024;
 
-// No conversion of any locale writes this many bytes beyond its width (glibc
-// pads "%z" twice, the sign and then the digits to the width each).
-constexpr std::size_t kMaxConversionBytes = 4096;
+// What one conversion may write beyond twice its width: more than any name,
+// date or era form of any locale. (glibc pads "%z" twice, the sign and then the
+// digits, each to the width.)
+constexpr std::size_t kConversionAllowance = 512;
 
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 
@@ -44,74 +45,58 @@ Conversion ReadConversion(const char* percent) {
   return {static_cast<std::size_t>(p - percent), width};
 }
 
-bool HasFieldWidth(const char* pattern) {
-  for (const char* p = std::strchr(pattern, '%'); p != nullptr;
-       p = std::strchr(p + 1, '%')) {
-    const char* after_flags = p + 1;
-    while (*after_flags != '\0' && std::strchr("_-0^#", *after_flags) != nullptr) {
-      ++after_flags;
-    }
-    if (IsDigit(*after_flags)) return true;
-    if (*after_flags == '%') p = after_flags;  // "%%" is a conversion of its own
+// Appends what strftime writes for the pattern text [begin, end), whose
+// conversions may write `allowance` bytes in all. strftime returns 0 both for an
+// empty text and for one that does not fit, so the buffer grows from a size that
+// fits most texts to one that fits any, where 0 means empty. One call takes the
+// whole run: glibc carries some flags from one conversion to the next ("%-EY"
+// leaves later "%EY" unpadded), so conversions must not be written apart.
+void AppendStrftime(const std::tm& tm, const char* begin, const char* end,
+                    std::size_t allowance, std::string* out) {
+  if (begin == end) return;
+  std::string cut;  // the run as a C string, when it ends before the pattern
+  const char* run = begin;
+  if (*end != '\0') {
+    cut.assign(begin, end);
+    run = cut.c_str();
   }
-  return false;
-}
-
-// strftime returns 0 both when the text does not fit and when it is empty (a
-// lone "%p" in a locale without AM/PM words); a size that any conversion of
-// `width` fits tells the two apart.
-void AppendConversion(const std::tm& tm, const std::string& conversion, std::size_t width,
-                      std::string* out) {
+  const std::size_t length = static_cast<std::size_t>(end - begin);
+  const std::size_t fits_any = length + allowance + 1;  // +1: strftime's NUL
   const std::size_t start = out->size();
-  const std::size_t size = width + kMaxConversionBytes;
-  out->resize(start + size);
-  const std::size_t length =
-      std::strftime(out->data() + start, size, conversion.c_str(), &tm);
-  out->resize(start + length);
-}
-
-// Conversion by conversion, each with room for what it can write; the text
-// between them is copied as strftime would copy it.
-void WritePieces(const std::tm& tm, const char* pattern, std::string* out) {
-  out->clear();
-  std::string conversion;
-  for (const char* p = pattern; *p != '\0';) {
-    const char* percent = std::strchr(p, '%');
-    if (percent == nullptr) {
-      out->append(p);
+  std::size_t size = std::min(2 * length + 64, fits_any);
+  for (;;) {
+    out->resize(start + size);
+    const std::size_t written = std::strftime(out->data() + start, size, run, &tm);
+    if (written > 0 || size == fits_any) {
+      out->resize(start + written);
       return;
     }
-    out->append(p, percent);
-    const Conversion read = ReadConversion(percent);
-    if (read.width > kMaxFieldWidth) {
-      out->append(percent, read.length);
-    } else {
-      conversion.assign(percent, read.length);
-      AppendConversion(tm, conversion, read.width, out);
-    }
-    p = percent + read.length;
+    size = std::min(size * 4, fits_any);
   }
 }
 
 void WriteStrftime(const platform::BrokenDownTime& fields, const char* pattern,
                    std::string* out) {
   out->clear();
-  const std::size_t pattern_length = std::strlen(pattern);
-  if (pattern_length == 0) return;
   const std::tm tm = platform::ToTm(fields);
-
-  // One call for the whole pattern in the common case: no field widths, and a
-  // text that fits twice the pattern's length.
-  if (!HasFieldWidth(pattern)) {
-    const std::size_t size = 2 * pattern_length + 64;
-    out->resize(size);
-    const std::size_t length = std::strftime(out->data(), size, pattern, &tm);
-    if (length > 0) {
-      out->resize(length);
-      return;
+  // The pattern goes to strftime in runs that end at a conversion too wide to
+  // apply, which is written as it stands.
+  const char* run = pattern;
+  std::size_t allowance = 0;
+  const char* percent = std::strchr(pattern, '%');
+  while (percent != nullptr) {
+    const Conversion read = ReadConversion(percent);
+    if (read.width > kMaxFieldWidth) {
+      AppendStrftime(tm, run, percent, allowance, out);
+      out->append(percent, read.length);
+      run = percent + read.length;
+      allowance = 0;
+    } else {
+      allowance += 2 * read.width + kConversionAllowance;
     }
+    percent = std::strchr(percent + read.length, '%');
   }
-  WritePieces(tm, pattern, out);
+  AppendStrftime(tm, run, run + std::strlen(run), allowance, out);
 }
 
 }  // namespace

@@ -1,8 +1,10 @@
 #include <gtest/gtest.h>
 
+#include <ctime>
 #include <string>
 
 #include "AdDateTime.h"
+#include "support/test_locales.h"
 #include "support/tz_guard.h"
 
 namespace {
@@ -102,6 +104,23 @@ TEST(Format, PatternsAndLimits) {
   };
   for (const auto& [wide, expected] : widths) {
     EXPECT_EQ(summer.Format(wide), expected) << wide;
+  }
+}
+
+// A pattern goes to strftime whole, widths or not: glibc carries a flag of one
+// era year ("%-EY") to the next, so writing conversions apart would differ.
+TEST(Format, ConversionsShareOneCall) {
+  DATETIMELIB_NEED_TEST_LOCALES();
+  TzGuard tz("Asia/Tokyo");
+  datetimelib::testing::ThreadLocale japanese("ja_JP.UTF-8");
+  const AdDateTime value = At(1679828296);  // 2023-03-26, Reiwa 5
+  const std::time_t time = 1679828296;
+  std::tm fields;
+  localtime_r(&time, &fields);
+  for (const char* pattern : {"%-EY %EY", "%-EY %5d %EY", "%_EY|%EY|%Oy"}) {
+    char expected[256];
+    const std::size_t length = std::strftime(expected, sizeof expected, pattern, &fields);
+    EXPECT_EQ(value.Format(pattern), std::string(expected, length)) << pattern;
   }
 }
 
