@@ -71,8 +71,8 @@ TEST(ParseTolvaneDateTime, Forms) {
       {kWednesday, "08-Jan.10:00:01", kLocal, "2002-01-08 10:00:01"},
       {UtcCount(2005, 1, 3, 17), "05-Jan", kLocal, "2004-01-05 00:00:00"},
       {UtcCount(1970, 1, 5, 17), "06-Jan", kLocal, "invalid"},  // back to 1969
-      // UTC fields, with the offset added to the instant read and no lower bound
-      // on its numbers.
+      // UTC fields, with the offset added to the instant read; its numbers may
+      // carry signs of their own, within 13:59 either way.
       {kWednesday, "10:00 UTC", kUtc, "2003-01-08 10:00:00"},
       {kWednesday, "05-Jan-2003.10:00 UTC+2", kUtc, "2003-01-05 12:00:00"},
       {kWednesday, "05-Jan-2003.10:00UTC-1:30", kUtc, "2003-01-05 08:30:00"},
