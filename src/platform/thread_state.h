@@ -30,7 +30,7 @@ struct ThreadState {
   std::optional<FileIdentity> watched_identity;
   std::int64_t last_file_check = 0;  // wall-clock second of the last check
 
-  // The forms of the locale read in last, of a type this layer does not know
+  // The forms of the locales read in last, of a type this layer does not know
   // (text/locale_reader.cc).
   std::shared_ptr<void> locale_forms;
 

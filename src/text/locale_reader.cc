@@ -1,8 +1,10 @@
 #include "text/locale_reader.h"
 
 #include <algorithm>
+#include <array>
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "platform/civil.h"
@@ -185,31 +187,45 @@ namespace {
 
 // A locale's reading forms and vocabulary, and the texts they were compiled
 // from. Compiling costs some microseconds, reading a text far less, so each
-// thread keeps those of the locale it read in last.
+// thread keeps those of the two locales it read in last: a text with a fraction
+// of a second reads in the user's default locale as well as in the thread's.
 struct CompiledLocale {
   std::vector<std::string> source_texts;
   LocaleForms forms;
   LocaleVocabulary vocabulary;
 };
 
+// Most recent first.
+using CompiledLocales = std::array<std::unique_ptr<CompiledLocale>, 2>;
+
+CompiledLocale& CompiledFor(locale_t locale) {
+  std::shared_ptr<void>& slot = platform::ThisThreadState().locale_forms;
+  if (slot == nullptr) slot = std::make_shared<CompiledLocales>();
+  CompiledLocales& recent = *static_cast<CompiledLocales*>(slot.get());
+  const auto same = [locale](const std::unique_ptr<CompiledLocale>& compiled) {
+    return compiled != nullptr &&
+           platform::SameLocaleSourceTexts(compiled->source_texts, locale);
+  };
+  if (!same(recent[0])) {
+    if (!same(recent[1])) {
+      const platform::LocaleWords words = platform::ReadLocaleWords(locale);
+      recent[1] = std::make_unique<CompiledLocale>(
+          CompiledLocale{platform::LocaleSourceTexts(locale), BuildLocaleForms(words),
+                         LocaleVocabulary(words, platform::LocaleCase(locale))});
+    }
+    std::swap(recent[0], recent[1]);
+  }
+  return *recent[0];
+}
+
 }  // namespace
 
 bool ReadInLocale(std::string_view text, locale_t locale, DateTimeFields* out) {
   if (locale == nullptr) return false;
-  std::shared_ptr<void>& slot = platform::ThisThreadState().locale_forms;
-  auto* compiled = static_cast<CompiledLocale*>(slot.get());
-  if (compiled == nullptr ||
-      !platform::SameLocaleSourceTexts(compiled->source_texts, locale)) {
-    const platform::LocaleWords words = platform::ReadLocaleWords(locale);
-    auto fresh = std::make_shared<CompiledLocale>(
-        CompiledLocale{platform::LocaleSourceTexts(locale), BuildLocaleForms(words),
-                       LocaleVocabulary(words, platform::LocaleCase(locale))});
-    compiled = fresh.get();
-    slot = std::move(fresh);
-  }
+  CompiledLocale& compiled = CompiledFor(locale);
   // Folding goes through this call's locale: the one compiled from may be gone.
-  compiled->vocabulary.set_folder(platform::LocaleCase(locale));
-  return ReadWithForms(text, compiled->forms, compiled->vocabulary, out);
+  compiled.vocabulary.set_folder(platform::LocaleCase(locale));
+  return ReadWithForms(text, compiled.forms, compiled.vocabulary, out);
 }
 
 }  // namespace datetimelib
