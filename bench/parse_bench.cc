@@ -1,8 +1,13 @@
 // Reading values from text: the canonical text as local time and as UTC, and the
 // compact form.
+#include <langinfo.h>
+
+#include <clocale>
 #include <ctime>
 #include <sstream>
 #include <string>
+#include <string_view>
+#include <vector>
 
 #include "AdDateTime.h"
 #include "inputs.h"
@@ -26,6 +31,36 @@ void BM_ParseLocal_Datetimelib(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations());
 }
 DATETIMELIB_BENCHMARK(BM_ParseLocal_Datetimelib);
+
+// A text with a fraction of a second that the thread's locale refuses reads
+// again in the user's default locale: here the two differ, and every call reads
+// in both.
+void BM_ParseLocalFraction_Datetimelib(benchmark::State& state) {
+  std::vector<std::string> texts;
+  for (std::string text : GetInputs().local_texts) {
+    text[10] = 'T';  // "2003-05-17T14:03:09.250"
+    texts.push_back(text + ".250");
+  }
+  const locale_t user = newlocale(LC_ALL_MASK, "", nullptr);
+  const bool user_is_utf8 =
+      user != nullptr && std::string_view(nl_langinfo_l(CODESET, user)) == "UTF-8";
+  if (user != nullptr) freelocale(user);
+  const locale_t other = newlocale(LC_ALL_MASK, user_is_utf8 ? "C" : "C.UTF-8", nullptr);
+  if (other == nullptr) {
+    state.SkipWithError("needs the C.UTF-8 locale");
+    return;
+  }
+  const locale_t before = uselocale(other);
+  std::size_t i = static_cast<std::size_t>(state.thread_index()) * 1000;
+  AdDateTime value;
+  for (auto _ : state) {
+    benchmark::DoNotOptimize(value.ParseDateTime(texts[At(i++)].c_str()));
+  }
+  uselocale(before);
+  freelocale(other);
+  state.SetItemsProcessed(state.iterations());
+}
+DATETIMELIB_BENCHMARK(BM_ParseLocalFraction_Datetimelib);
 
 void BM_ParseLocal_StrptimeMktime(benchmark::State& state) {
   const auto& texts = GetInputs().local_texts;
