@@ -7,7 +7,7 @@
 
 #include "AdDateTime.h"
 #include "fuzz_support.h"
-#include "platform/local_time.h"
+#include "platform/zone/local_time.h"
 
 namespace datetimelib::fuzz {
 namespace {

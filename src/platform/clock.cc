@@ -10,4 +10,6 @@ std::int64_t NowSeconds() {
   return static_cast<std::int64_t>(now.tv_sec);
 }
 
+std::int64_t CoarseNowSeconds() { return static_cast<std::int64_t>(time(nullptr)); }
+
 }  // namespace datetimelib::platform

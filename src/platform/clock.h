@@ -12,6 +12,10 @@ namespace datetimelib::platform {
 // place (tests/support/test_clock.cc) to fix "now".
 std::int64_t NowSeconds();
 
+// The same from the coarse clock, which may lag by a clock tick: one word read,
+// cheap enough for a check on every call.
+std::int64_t CoarseNowSeconds();
+
 }  // namespace datetimelib::platform
 
 #endif  // DATETIMELIB_PLATFORM_CLOCK_H_

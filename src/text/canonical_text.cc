@@ -1,17 +1,15 @@
 #include "text/canonical_text.h"
 
+#include "platform/ascii.h"
+
 namespace datetimelib {
 namespace {
-
-constexpr std::size_t kCanonicalLength = 19;  // "YYYY-MM-DD HH:MM:SS"
-
-bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 
 // The number written by `count` digits at `text`; -1 if any is not a digit.
 int Digits(const char* text, int count) {
   int value = 0;
   for (int i = 0; i < count; ++i) {
-    if (!IsDigit(text[i])) return -1;
+    if (!platform::IsAsciiDigit(text[i])) return -1;
     value = value * 10 + (text[i] - '0');
   }
   return value;

@@ -3,6 +3,7 @@
 #ifndef DATETIMELIB_TEXT_CANONICAL_TEXT_H_
 #define DATETIMELIB_TEXT_CANONICAL_TEXT_H_
 
+#include <cstddef>
 #include <string_view>
 
 #include "text/date_time_fields.h"
@@ -10,6 +11,7 @@
 namespace datetimelib {
 
 inline constexpr char kCanonicalPattern[] = "%Y-%m-%d %H:%M:%S";
+inline constexpr std::size_t kCanonicalLength = 19;  // "YYYY-MM-DD HH:MM:SS"
 
 // Reads exactly "YYYY-MM-DD HH:MM:SS" (digits in every place), followed by
 // nothing but blanks. Refuses fields that name no real date-time.

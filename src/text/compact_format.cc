@@ -3,7 +3,7 @@
 #include <string>
 
 #include "AdDateTime.h"
-#include "platform/local_time.h"
+#include "platform/zone/local_time.h"
 #include "text/digits.h"
 #include "text/english_names.h"
 

@@ -7,8 +7,8 @@
 #include <string>
 
 #include "AdDateTime.h"
-#include "platform/civil.h"
-#include "platform/local_time.h"
+#include "platform/civil/civil.h"
+#include "platform/zone/local_time.h"
 #include "text/canonical_text.h"
 #include "text/compact_text.h"
 #include "text/english_names.h"

@@ -1,6 +1,6 @@
 #include "text/compact_text.h"
 
-#include "text/decimal_reader.h"
+#include "text/colon_numbers.h"
 #include "text/english_names.h"
 
 namespace datetimelib {

@@ -2,7 +2,7 @@
 #ifndef DATETIMELIB_TEXT_DATE_TIME_FIELDS_H_
 #define DATETIMELIB_TEXT_DATE_TIME_FIELDS_H_
 
-#include "platform/civil.h"
+#include "platform/civil/civil.h"
 
 namespace datetimelib {
 

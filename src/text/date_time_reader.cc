@@ -1,8 +1,8 @@
 #include "text/date_time_reader.h"
 
-#include "platform/locale_handle.h"
+#include "platform/locale/locale_handle.h"
 #include "text/canonical_text.h"
-#include "text/locale_reader.h"
+#include "text/locale_forms.h"
 
 namespace datetimelib {
 

@@ -1,6 +1,6 @@
 // Writing a value as text with a strftime pattern, in local time or in UTC.
 #include "AdDateTime.h"
-#include "platform/local_time.h"
+#include "platform/zone/local_time.h"
 #include "text/strftime_text.h"
 
 // What the formatters give for a value that is not valid (and for a valid one

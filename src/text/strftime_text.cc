@@ -1,16 +1,17 @@
 #include "text/strftime_text.h"
 
+#include <time.h>
+
 #include <algorithm>
 #include <cstring>
 #include <ctime>
 
+#include "platform/ascii.h"
 #include "text/canonical_text.h"
 #include "text/digits.h"
 
 namespace datetimelib {
 namespace {
-
-constexpr std::size_t kCanonicalLength = 19;  // "YYYY-MM-DD HH:MM:SS"
 
 // A conversion may ask for a field width ("%10d"); wider ones are not applied,
 // so that a short pattern cannot ask for gigabytes ("%2147483647d"). Such a
@@ -21,8 +22,6 @@ constexpr std::size_t kMaxFieldWidth = 1024;
 // date or era form of any locale. (glibc pads "%z" twice, the sign and then the
 // digits, each to the width.)
 constexpr std::size_t kConversionAllowance = 512;
-
-bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 
 // One conversion of a pattern: "%" [flags] [width] [modifier] character, as the
 // C library reads it; the character is missing at the end of the pattern. The
@@ -37,7 +36,7 @@ Conversion ReadConversion(const char* percent) {
   const char* p = percent + 1;
   while (*p != '\0' && std::strchr("_-0^#", *p) != nullptr) ++p;
   std::size_t width = 0;
-  for (; IsDigit(*p); ++p) {
+  for (; platform::IsAsciiDigit(*p); ++p) {
     width = std::min(width * 10 + static_cast<std::size_t>(*p - '0'), kMaxFieldWidth + 1);
   }
   if (*p == 'E' || *p == 'O') ++p;
@@ -51,8 +50,9 @@ Conversion ReadConversion(const char* percent) {
 // fits most texts to one that fits any, where 0 means empty. One call takes the
 // whole run: glibc carries some flags from one conversion to the next ("%-EY"
 // leaves later "%EY" unpadded), so conversions must not be written apart.
+// `locale` null: the calling thread's locale.
 void AppendStrftime(const std::tm& tm, const char* begin, const char* end,
-                    std::size_t allowance, std::string* out) {
+                    std::size_t allowance, locale_t locale, std::string* out) {
   if (begin == end) return;
   std::string cut;  // the run as a C string, when it ends before the pattern
   const char* run = begin;
@@ -66,7 +66,10 @@ void AppendStrftime(const std::tm& tm, const char* begin, const char* end,
   std::size_t size = std::min(2 * length + 64, fits_any);
   for (;;) {
     out->resize(start + size);
-    const std::size_t written = std::strftime(out->data() + start, size, run, &tm);
+    char* const buffer = out->data() + start;
+    const std::size_t written = locale != nullptr
+                                    ? strftime_l(buffer, size, run, &tm, locale)
+                                    : std::strftime(buffer, size, run, &tm);
     if (written > 0 || size == fits_any) {
       out->resize(start + written);
       return;
@@ -76,7 +79,7 @@ void AppendStrftime(const std::tm& tm, const char* begin, const char* end,
 }
 
 void WriteStrftime(const platform::BrokenDownTime& fields, const char* pattern,
-                   std::string* out) {
+                   locale_t locale, std::string* out) {
   out->clear();
   const std::tm tm = platform::ToTm(fields);
   // The pattern goes to strftime in runs that end at a conversion too wide to
@@ -87,7 +90,7 @@ void WriteStrftime(const platform::BrokenDownTime& fields, const char* pattern,
   while (percent != nullptr) {
     const Conversion read = ReadConversion(percent);
     if (read.width > kMaxFieldWidth) {
-      AppendStrftime(tm, run, percent, allowance, out);
+      AppendStrftime(tm, run, percent, allowance, locale, out);
       out->append(percent, read.length);
       run = percent + read.length;
       allowance = 0;
@@ -96,7 +99,7 @@ void WriteStrftime(const platform::BrokenDownTime& fields, const char* pattern,
     }
     percent = std::strchr(percent + read.length, '%');
   }
-  AppendStrftime(tm, run, run + std::strlen(run), allowance, out);
+  AppendStrftime(tm, run, run + std::strlen(run), allowance, locale, out);
 }
 
 }  // namespace
@@ -107,7 +110,7 @@ void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
   // lies within them.
   if (std::strcmp(pattern, kCanonicalPattern) != 0 || fields.year < 1000 ||
       fields.year > 9999) {
-    WriteStrftime(fields, pattern, out);
+    WriteStrftime(fields, pattern, nullptr, out);
     return;
   }
   out->resize(kCanonicalLength);
@@ -123,6 +126,15 @@ void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
   p = WriteTwoDigits(p, fields.minute);
   *p++ = ':';
   WriteTwoDigits(p, fields.second);
+}
+
+void WritePatternInLocale(const platform::BrokenDownTime& fields, const char* pattern,
+                          locale_t locale, std::string* out) {
+  if (locale == nullptr) {
+    out->clear();
+    return;
+  }
+  WriteStrftime(fields, pattern, locale, out);
 }
 
 }  // namespace datetimelib

@@ -1,10 +1,13 @@
-// Writing broken-down fields with a strftime pattern into a std::string.
+// Writing broken-down fields with a strftime pattern into a std::string: every
+// strftime call of the library.
 #ifndef DATETIMELIB_TEXT_STRFTIME_TEXT_H_
 #define DATETIMELIB_TEXT_STRFTIME_TEXT_H_
 
+#include <locale.h>
+
 #include <string>
 
-#include "platform/local_time.h"
+#include "platform/zone/local_time.h"
 
 namespace datetimelib {
 
@@ -13,6 +16,11 @@ namespace datetimelib {
 // digit, to the same text, without strftime.
 void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
                   std::string* out);
+
+// The same in `locale` (not LC_GLOBAL_LOCALE); the empty text for a null locale,
+// which a handle holds only when the C library had no memory to open one.
+void WritePatternInLocale(const platform::BrokenDownTime& fields, const char* pattern,
+                          locale_t locale, std::string* out);
 
 }  // namespace datetimelib
 

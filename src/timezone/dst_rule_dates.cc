@@ -1,16 +1,15 @@
 // Daylight-saving dates computed from the zone's current rule.
+#include "timezone/dst_rule_dates.h"
+
 #include "AdDateTime.h"
-#include "platform/civil.h"
-#include "platform/local_time.h"
-#include "platform/zone_source.h"
+#include "platform/civil/civil.h"
+#include "platform/zone/current_zone.h"
+#include "platform/zone/local_time.h"
 #include "text/canonical_text.h"
 #include "text/strftime_text.h"
-#include "timezone/rule_dates.h"
 
 namespace datetimelib {
 namespace {
-
-constexpr std::int64_t kSecondsPerDay = 86400;
 
 // The text of a transition's local date-time moved by `shift_seconds`.
 //
@@ -24,8 +23,9 @@ std::string TransitionText(const platform::TransitionRule& transition, int year,
   // |civil| < 2^47 for every int year: 2^31 years of 2^25 seconds.
   const std::int64_t civil =
       platform::TransitionInYear(transition, year).CivilSeconds() + shift_seconds;
-  const std::int64_t days = platform::FloorDiv(civil, kSecondsPerDay);
-  const std::int64_t second_of_day = civil - days * kSecondsPerDay;  // [0, 86399]
+  const std::int64_t days = platform::FloorDiv(civil, platform::kSecondsPerDay);
+  const std::int64_t second_of_day =
+      civil - days * platform::kSecondsPerDay;  // [0, 86399]
   const platform::CivilDay date = platform::CivilFromDays(days);
   const AdDateTime value(date.year, date.month, date.day, second_of_day / 3600,
                          second_of_day / 60 % 60, second_of_day % 60);
@@ -51,8 +51,9 @@ void WriteRuleDates(const platform::PosixRule& rule, int year, std::string* star
 }  // namespace datetimelib
 
 int AdDateTime::GenerateDSTDates(int year, std::string& start, std::string& end) {
-  datetimelib::WriteRuleDates(
-      datetimelib::platform::CurrentRule(datetimelib::platform::LoadProcessZone()), year,
-      &start, &end);
+  // A copy: writing the dates builds values, which may compile the zone anew.
+  const datetimelib::platform::PosixRule rule =
+      datetimelib::platform::CurrentZone().current_rule();
+  datetimelib::WriteRuleDates(rule, year, &start, &end);
   return 1;
 }

@@ -5,9 +5,9 @@
 
 #include "AdDateTime.h"
 #include "platform/regular_file.h"
-#include "platform/zone_source.h"
+#include "platform/zone/current_zone.h"
 #include "text/canonical_text.h"
-#include "timezone/rule_dates.h"
+#include "timezone/dst_rule_dates.h"
 #include "timezone/table_lines.h"
 
 namespace datetimelib {
@@ -52,8 +52,9 @@ int AdDateTime::GetDSTDates(const char* directory, int year, std::string& start,
                             std::string& end) {
   start.clear();
   end.clear();
+  // A copy: reading the table reads dates, which may compile the zone anew.
   const datetimelib::platform::PosixRule rule =
-      datetimelib::platform::CurrentRule(datetimelib::platform::LoadProcessZone());
+      datetimelib::platform::CurrentZone().current_rule();
   if (rule.dst == datetimelib::platform::PosixRule::Dst::kNone) return 0;
   if (directory != nullptr &&
       datetimelib::ReadTable(std::string(directory) + "/" + datetimelib::kTableName, year,

@@ -52,7 +52,6 @@ bool TableLines::Fill() {
   failed_ = count < 0;
   begin_ = 0;
   end_ = count > 0 ? static_cast<std::size_t>(count) : 0;
-  if (count > 0) bytes_read_ += static_cast<std::uint64_t>(count);
   return count > 0;
 }
 

@@ -7,7 +7,6 @@
 #define DATETIMELIB_TIMEZONE_TABLE_LINES_H_
 
 #include <cstddef>
-#include <cstdint>
 #include <string>
 
 #include "platform/regular_file.h"
@@ -29,9 +28,6 @@ class TableLines {
   // grows beyond kMaxTableLineBytes.
   bool Next(std::string* line);
 
-  // Bytes read from the file so far: each byte of the file is read once.
-  std::uint64_t bytes_read() const { return bytes_read_; }
-
  private:
   bool Fill();
 
@@ -39,7 +35,6 @@ class TableLines {
   char buffer_[4096];
   std::size_t begin_ = 0;  // the unread bytes are buffer_[begin_, end_)
   std::size_t end_ = 0;
-  std::uint64_t bytes_read_ = 0;
   bool failed_ = false;
 };
 

@@ -1,10 +1,9 @@
 // Leap years, month lengths and Sunday-to-Saturday weeks.
 #include "AdDateTime.h"
-#include "platform/local_time.h"
+#include "platform/civil/civil.h"
+#include "platform/zone/local_time.h"
 
 namespace {
-
-constexpr std::int64_t kSecondsPerDay = 86400;
 
 // The week's first or last day at 00:00:00 local time. The step is taken from
 // noon in whole days of 86 400 seconds, which lands on the right calendar day
@@ -19,34 +18,19 @@ AdDateTime WeekBoundary(long year, long month, long day, bool week_end) {
   }
   const long weekday = noon.GetDayOfWeek();  // 1 == Sunday
   const std::int64_t days = week_end ? 7 - weekday : 1 - weekday;
-  const auto target = datetimelib::platform::BreakDownLocal(
-      std::int64_t{noon.GetCTime().GetTime()} + days * kSecondsPerDay);
+  const auto target =
+      datetimelib::platform::BreakDownLocal(std::int64_t{noon.GetCTime().GetTime()} +
+                                            days * datetimelib::platform::kSecondsPerDay);
   return AdDateTime(target.year, target.month, target.day, 0, 0, 0);
 }
 
 }  // namespace
 
-int IsLeapYear(long year) {
-  if (year % 4 != 0) return 0;
-  if (year % 100 != 0) return 1;
-  return year % 400 == 0 ? 1 : 0;
-}
+int IsLeapYear(long year) { return datetimelib::platform::IsLeap(year) ? 1 : 0; }
 
 long GetDaysInMonth(long year, long month) {
-  switch (month) {
-    case 2:
-      return IsLeapYear(year) ? 29 : 28;
-    case 1:
-    case 3:
-    case 5:
-    case 7:
-    case 8:
-    case 10:
-    case 12:
-      return 31;
-    default:
-      return 30;
-  }
+  if (month < 1 || month > 12) return 30;
+  return datetimelib::platform::DaysInMonth(year, static_cast<int>(month));
 }
 
 AdDateTime GetWeekStartDate(long year, long month, long day) {

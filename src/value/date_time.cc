@@ -2,10 +2,9 @@
 #include <cstdio>
 
 #include "AdDateTime.h"
-#include "platform/civil.h"
+#include "platform/civil/civil.h"
 #include "platform/clock.h"
-#include "platform/local_time.h"
-#include "value/local_count.h"
+#include "platform/zone/local_time.h"
 
 namespace {
 
@@ -20,21 +19,19 @@ std::string FieldsText(long year, long month, long day, long hour, long minute,
   return std::string(text, static_cast<std::size_t>(length));
 }
 
-}  // namespace
-
-namespace datetimelib {
-
+// The 32-bit count of local fields, carried as mktime carries them; nothing when
+// the local time has no 32-bit count. No range test is made.
 std::optional<std::int32_t> LocalCount(long year, long month, long day, long hour,
                                        long minute, long second) {
   const std::optional<std::int64_t> civil =
-      platform::CivilSeconds(year, month, day, hour, minute, second);
+      datetimelib::platform::CivilSeconds(year, month, day, hour, minute, second);
   if (!civil) return std::nullopt;
-  const std::int64_t instant = platform::ComposeLocal(*civil);
+  const std::int64_t instant = datetimelib::platform::ComposeLocal(*civil);
   if (instant < INT32_MIN || instant > INT32_MAX) return std::nullopt;
   return static_cast<std::int32_t>(instant);
 }
 
-}  // namespace datetimelib
+}  // namespace
 
 AdDateTime::AdDateTime(const AdTime& time) : seconds_(time.GetTime()), status_(valid) {}
 
@@ -42,10 +39,10 @@ AdDateTime::AdDateTime(long year, long month, long day, long hour, long minute,
                        long second) {
   std::optional<std::int32_t> count;
   if (Valid_Range(year, month, day, hour, minute, second)) {
-    count = datetimelib::LocalCount(year, month, day, hour, minute, second);
+    count = LocalCount(year, month, day, hour, minute, second);
   } else if (year == 1899 && month == 12 && day == 30) {
     // The day that locale readers give to a time of day read alone.
-    count = datetimelib::LocalCount(1970, 1, 1, hour, minute, second);
+    count = LocalCount(1970, 1, 1, hour, minute, second);
   }
   if (count) {
     seconds_ = *count;

@@ -9,8 +9,8 @@
 #include <sstream>
 #include <utility>
 
-#include "platform/civil.h"
-#include "platform/local_time.h"
+#include "platform/civil/civil.h"
+#include "platform/zone/local_time.h"
 #include "support/tz_guard.h"
 
 namespace datetimelib::testing {

@@ -4,7 +4,7 @@
 
 #include <string>
 
-#include "platform/posix_rule.h"
+#include "platform/zone/posix_rule.h"
 
 namespace datetimelib::testing {
 

@@ -29,4 +29,9 @@ std::int64_t NowSeconds() {
   return static_cast<std::int64_t>(now.tv_sec);
 }
 
+std::int64_t CoarseNowSeconds() {
+  const std::int64_t fixed = fixed_now.load();
+  return fixed != kRealTime ? fixed : static_cast<std::int64_t>(time(nullptr));
+}
+
 }  // namespace datetimelib::platform

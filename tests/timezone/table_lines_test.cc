@@ -17,7 +17,6 @@ using datetimelib::platform::RegularFile;
 
 struct Reading {
   std::vector<std::string> lines;
-  std::uint64_t bytes_read = 0;
   std::size_t largest_capacity = 0;  // of the line buffer, over the whole read
 };
 
@@ -33,7 +32,6 @@ Reading ReadAll(const std::string& path) {
     if (!more) break;
     reading.lines.push_back(line);
   }
-  reading.bytes_read = lines.bytes_read();
   return reading;
 }
 
@@ -57,14 +55,13 @@ TEST(TableLines, PassesOverWhatNoEntryCanBe) {
     SCOPED_TRACE(c.name);
     const Reading reading = ReadAll(folder.Write("table", c.content));
     EXPECT_EQ(reading.lines, c.lines);
-    EXPECT_EQ(reading.bytes_read, c.content.size());
     EXPECT_LE(reading.largest_capacity, 2 * kMaxTableLineBytes);
   }
 }
 
 // 100 MB of NUL bytes (a sparse file: nothing is written but the last line), then
-// an entry: read in one pass, the line buffer bounded by one line.
-TEST(TableLines, HundredMegabytesInOnePassWithBoundedMemory) {
+// an entry: read through, the line buffer bounded by one line.
+TEST(TableLines, HundredMegabytesWithBoundedMemory) {
   datetimelib::testing::TempDir folder;
   ASSERT_TRUE(folder.ok());
   const std::string path = folder.Path("table");
@@ -79,7 +76,6 @@ TEST(TableLines, HundredMegabytesInOnePassWithBoundedMemory) {
   const Reading reading = ReadAll(path);
   EXPECT_EQ(reading.lines,
             std::vector<std::string>{"2003-04-06 01:59:59;2003-10-26 02:00:00"});
-  EXPECT_EQ(reading.bytes_read, static_cast<std::uint64_t>(kHole) + last.size());
   EXPECT_LE(reading.largest_capacity, 2 * kMaxTableLineBytes);
 }
 

@@ -3,7 +3,7 @@
 #include <climits>
 
 #include "AdDateTime.h"
-#include "platform/civil.h"
+#include "platform/civil/civil.h"
 #include "support/tz_guard.h"
 #include "support/value_text.h"
 

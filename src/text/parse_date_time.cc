@@ -1,0 +1,68 @@
+// Setting a value from text read in the locale's forms, as local time or as UTC.
+#include <string_view>
+
+#include "AdDateTime.h"
+#include "platform/civil/civil.h"
+#include "text/canonical_text.h"
+#include "text/date_time_reader.h"
+
+namespace {
+
+using datetimelib::DateTimeFields;
+using datetimelib::kCanonicalLength;
+using datetimelib::ReadDateTime;
+using datetimelib::ReadingLocale;
+
+// The thread's locale first. A text the thread's locale refuses that has the
+// shape of the canonical text followed by a fraction of a second ("." as its
+// 20th byte) is read once more, cut to 19 bytes, in the user's default locale:
+// the fraction is dropped, never rounded.
+bool ParseLocaleDateTime(std::string_view text, DateTimeFields* out) {
+  if (ReadDateTime(text, ReadingLocale::kThread, out)) return true;
+  if (text.size() > kCanonicalLength && text[kCanonicalLength] == '.') {
+    return ReadDateTime(text.substr(0, kCanonicalLength), ReadingLocale::kUserDefault,
+                        out);
+  }
+  return false;
+}
+
+}  // namespace
+
+int AdDateTime::ParseDateTime(const char* text, std::uint32_t /*flags*/) {
+  const std::string_view input = text != nullptr ? text : "";
+  DateTimeFields fields;
+  if (!ParseLocaleDateTime(input, &fields)) {
+    status_ = invalid;
+    kept_text_.assign(input);
+    return 0;
+  }
+  SetDateTime(fields.year, fields.month, fields.day, fields.hour, fields.minute,
+              fields.second);
+  if (status_ == valid) return 1;
+  kept_text_.assign(input);
+  return 0;
+}
+
+int AdDateTime::ParseDateTimeGMT(const char* text) {
+  const std::string_view input = text != nullptr ? text : "";
+  DateTimeFields f;
+  if (!ParseLocaleDateTime(input, &f)) {
+    status_ = invalid;
+    kept_text_.assign(input);
+    return 0;
+  }
+  // No 1899-12-30 rule here: a time of day alone is out of range.
+  if (!Valid_Range(f.year, f.month, f.day, f.hour, f.minute, f.second)) {
+    status_ = outOfRange;
+    kept_text_.assign(input);
+    return 0;
+  }
+  // The reader gives real dates only, and the range test bounds them by
+  // 2038-01-18 23:59:59 (2 147 471 999 s), so the count fits in 32 bits.
+  const std::int64_t days = datetimelib::platform::DaysFromCivil(f.year, f.month, f.day);
+  seconds_ = static_cast<std::int32_t>(days * datetimelib::platform::kSecondsPerDay +
+                                       f.hour * 3600 + f.minute * 60 + f.second);
+  status_ = valid;
+  kept_text_.clear();
+  return 1;
+}

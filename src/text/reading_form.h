@@ -1,0 +1,129 @@
+// Reading forms: a locale's strftime patterns turned into strict readers.
+//
+// A pattern such as "%d.%m.%Y" or "%I:%M:%S %p" is compiled into steps, with the
+// locale's references (%x, %X, %c, %r) and the shorthands (%T, %R, %D, %F)
+// written out. Each step then reads its part of a text, and nothing else:
+//
+//   %Y        exactly four digits
+//   %y        exactly two digits: 69..99 are 1969..1999, 00..68 are 2000..2068,
+//             as POSIX strptime takes them
+//   %m %d %H %I %M %S
+//             one or two digits (what strftime writes, and what people type)
+//   %e %k %l  the same after any blanks (strftime pads these with a blank)
+//   %b %B %h  a month name of the locale, full or abbreviated, in any case, an
+//             abbreviation with or without its final "."
+//   %a %A     a weekday name, likewise; it must be the weekday of the date
+//   %p %P     the locale's AM or PM word, in any case
+//   blank     one or more blanks (space or tab)
+//   %n %t     any number of blanks, none included
+//   other     itself, byte for byte
+//
+// strptime_l is not used: it takes 30 February and seconds 60 and 61, skips
+// blanks anywhere, and stops before the end of a text without saying so.
+//
+// Ranges are not tested while reading: the reader judges the fields once the
+// whole text is read. %Z and %z are left out of a form together with the
+// blank before them: a text naming a zone is refused rather than read in the
+// wrong one. Patterns with conversions that name no field of a date-time (%j,
+// %U, era and alternative-digit forms) give no form.
+#ifndef DATETIMELIB_TEXT_READING_FORM_H_
+#define DATETIMELIB_TEXT_READING_FORM_H_
+
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "platform/locale/case_folding.h"
+#include "platform/locale/langinfo.h"
+
+namespace datetimelib {
+
+enum class FormStep {
+  kLiteral,
+  kBlanks,     // one or more
+  kAnyBlanks,  // zero or more
+  kYear4,
+  kYear2,
+  kMonth,
+  kMonthName,
+  kDay,
+  kHour,
+  kHour12,
+  kMinute,
+  kSecond,
+  kAmPm,
+  kWeekdayName,  // the last: Classify counts steps up to it
+};
+
+struct FormToken {
+  FormStep step;
+  std::string literal;        // kLiteral only
+  bool blank_padded = false;  // numbers: blanks may come first
+};
+
+struct ReadingForm {
+  std::vector<FormToken> tokens;
+  bool has_date = false;  // year, month and day
+  bool has_time = false;  // hour and minute
+};
+
+// The fields a form read, each -1 where the form has no such step.
+struct FormValues {
+  int year = -1;     // with century
+  int month = -1;    // [1:12] when read
+  int day = -1;      // [0:99] when read, judged later
+  int hour = -1;     // 24-hour clock, [0:99] when read
+  int hour12 = -1;   // 12-hour clock, [0:99] when read
+  int minute = -1;   // [0:99]
+  int second = -1;   // [0:99]
+  int pm = -1;       // 0 AM, 1 PM
+  int weekday = -1;  // [0:6], 0 == Sunday
+};
+
+// A locale's names, lowered for comparison in any case.
+class LocaleVocabulary {
+ public:
+  LocaleVocabulary(const platform::LocaleWords& words,
+                   const platform::LocaleCase& folder);
+
+  bool has_am_pm() const { return !am_pm_.empty(); }
+
+  // Reads texts with `folder` from now on: one of a locale with the same
+  // character types as the one the names were lowered with.
+  void set_folder(const platform::LocaleCase& folder) { folder_ = folder; }
+
+  // The longest name of the list at `text[position]`: its number, and the bytes
+  // it takes in `*length`; -1 when none is there.
+  int MatchMonth(std::string_view text, std::size_t position, std::size_t* length) const;
+  int MatchWeekday(std::string_view text, std::size_t position,
+                   std::size_t* length) const;
+  int MatchAmPm(std::string_view text, std::size_t position, std::size_t* length) const;
+
+ private:
+  using NameList = std::vector<std::pair<std::u32string, int>>;  // lowered name, number
+  void Add(std::string_view name, int number, NameList* list) const;
+  int Match(const NameList& list, std::string_view text, std::size_t position,
+            std::size_t* length) const;
+
+  platform::LocaleCase folder_;
+  NameList months_;    // 1 == January
+  NameList weekdays_;  // 0 == Sunday
+  NameList am_pm_;     // 0 AM, 1 PM
+};
+
+// Compiles a pattern, writing out the locale's references from `words`.
+// Nothing for a pattern that gives no form (see the top of this file).
+std::optional<ReadingForm> CompileForm(std::string_view pattern,
+                                       const platform::LocaleWords& words);
+
+// Reads `text` from `position` by the steps of `form`. On success moves
+// `*position` past what was read and fills `*values`.
+bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
+               std::string_view text, std::size_t* position, FormValues* values);
+
+}  // namespace datetimelib
+
+#endif  // DATETIMELIB_TEXT_READING_FORM_H_

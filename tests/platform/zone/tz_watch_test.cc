@@ -1,0 +1,81 @@
+#include "platform/zone/tz_watch.h"
+
+#include <gtest/gtest.h>
+#include <unistd.h>
+
+#include <cstdlib>
+#include <cstring>
+#include <string>
+#include <vector>
+
+namespace {
+
+using datetimelib::platform::TzWatch;
+
+// Saves the whole environment and puts it back, whatever a test did to it.
+class EnvironmentGuard {
+ public:
+  EnvironmentGuard() {
+    for (char** entry = environ; entry != nullptr && *entry != nullptr; ++entry)
+      saved_.emplace_back(*entry);
+  }
+  ~EnvironmentGuard() {
+    clearenv();
+    for (const std::string& entry : saved_) {
+      const std::size_t equals = entry.find('=');
+      setenv(entry.substr(0, equals).c_str(), entry.substr(equals + 1).c_str(), 1);
+    }
+  }
+
+ private:
+  std::vector<std::string> saved_;
+};
+
+char tz_entry[] = "TZ=UTC0";  // given to putenv, then changed in place
+
+// Each step changes TZ in one of the ways the rest of the suite does not (there,
+// TZ is set over a TZ already set); the watch must notice it, and after a
+// refresh report TZ's new value.
+TEST(TzWatch, NoticesEveryWayTzChanges) {
+  EnvironmentGuard guard;
+  unsetenv("TZ");
+  TzWatch watch;
+  EXPECT_FALSE(watch.Unchanged());  // nothing read yet
+  watch.Refresh();
+  const struct {
+    void (*change)();
+    const char* tz;  // afterwards
+  } steps[] = {
+      // setenv while unset: an entry past the end of the one read.
+      {[] { setenv("TZ", "UTC", 1); }, "UTC"},
+      // putenv: another string in TZ's place.
+      {[] { putenv(tz_entry); }, "UTC0"},
+      // putenv's string changed in place.
+      {[] { std::memcpy(tz_entry, "TZ=EST5", 7); }, "EST5"},
+  };
+  for (const auto& step : steps) {
+    ASSERT_TRUE(watch.Unchanged());
+    step.change();
+    EXPECT_FALSE(watch.Unchanged()) << step.tz;
+    watch.Refresh();
+    EXPECT_EQ(watch.value(), step.tz);
+  }
+}
+
+// The environment shrinks to one entry while the watch remembers forty; under
+// AddressSanitizer this shows that nothing beyond the new array is read.
+TEST(TzWatch, ShrunkenEnvironmentIsNotOverread) {
+  EnvironmentGuard guard;
+  for (int i = 0; i < 40; ++i)
+    setenv(("DATETIMELIB_V" + std::to_string(i)).c_str(), "x", 1);
+  unsetenv("TZ");
+  TzWatch watch;
+  watch.Refresh();
+  for (int round = 0; round < 50; ++round) {
+    clearenv();
+    setenv("A", "1", 1);
+    EXPECT_FALSE(watch.Unchanged());
+  }
+}
+
+}  // namespace
