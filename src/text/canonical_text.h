@@ -1,3 +1,7 @@
+// Folder src/text/: every text in and out: strftime patterns (every strftime
+// call of the library), the locale's own forms, the compact form and what people
+// type, the canonical text; the AdDateTime members that format and parse.
+//
 // The canonical text "%Y-%m-%d %H:%M:%S": the one form in which the library
 // writes values that it reads back, read here without any locale machinery.
 #ifndef DATETIMELIB_TEXT_CANONICAL_TEXT_H_

@@ -132,7 +132,7 @@ bool ReadRest(const ReadingForm& form, const LocaleVocabulary& vocabulary,
 
 }  // namespace
 
-LocaleForms BuildLocaleForms(const platform::LocaleWords& words) {
+LocaleForms BuildLocaleForms(const platform::LangInfo& words) {
   const bool has_am_pm = !words.am.empty() && !words.pm.empty();
   FormCollector collector;
   for (const char* pattern : kPatterns) {
@@ -206,10 +206,10 @@ CompiledLocale& CompiledFor(locale_t locale) {
   };
   if (!same(recent[0])) {
     if (!same(recent[1])) {
-      const platform::LocaleWords words = platform::ReadLocaleWords(locale);
+      const platform::LangInfo words = platform::ReadLangInfo(locale);
       recent[1] = std::make_unique<CompiledLocale>(
           CompiledLocale{platform::LocaleSourceTexts(locale), BuildLocaleForms(words),
-                         LocaleVocabulary(words, platform::LocaleCase(locale))});
+                         LocaleVocabulary(words, platform::CaseFolder(locale))});
     }
     std::swap(recent[0], recent[1]);
   }
@@ -222,7 +222,7 @@ bool ReadInLocale(std::string_view text, locale_t locale, DateTimeFields* out) {
   if (locale == nullptr) return false;
   CompiledLocale& compiled = CompiledFor(locale);
   // Folding goes through this call's locale: the one compiled from may be gone.
-  compiled.vocabulary.set_folder(platform::LocaleCase(locale));
+  compiled.vocabulary.set_folder(platform::CaseFolder(locale));
   return ReadWithForms(text, compiled.forms, compiled.vocabulary, out);
 }
 

@@ -40,7 +40,7 @@ struct LocaleForms {
 };
 
 // The forms above for a locale with these words, without repeats.
-LocaleForms BuildLocaleForms(const platform::LocaleWords& words);
+LocaleForms BuildLocaleForms(const platform::LangInfo& words);
 
 // Reads the whole text by the first form that takes all of it and gives
 // possible fields.

@@ -7,7 +7,7 @@
 namespace datetimelib {
 namespace {
 
-using platform::LocaleWords;
+using platform::LangInfo;
 
 // %c may refer to %r or %x, which refer to nothing further in any locale; the
 // bound only stops a locale whose patterns refer to themselves.
@@ -40,7 +40,7 @@ constexpr FieldConversion kFieldConversions[] = {
 // Builds the steps of a pattern and of the patterns it refers to.
 class FormBuilder {
  public:
-  explicit FormBuilder(const LocaleWords& words) : words_(words) {}
+  explicit FormBuilder(const LangInfo& words) : words_(words) {}
 
   // pattern := { blank | literal-byte | "%" flags* width? conversion }
   // flags   := "_" | "-" | "0" | "^" | "#"      ("_" pads numbers with blanks)
@@ -157,7 +157,7 @@ class FormBuilder {
     }
   }
 
-  const LocaleWords& words_;
+  const LangInfo& words_;
   std::vector<FormToken> tokens_;
   bool drop_next_blanks_ = false;
 };
@@ -233,8 +233,8 @@ int* FieldOf(FormStep step, FormValues* values) {
 
 }  // namespace
 
-LocaleVocabulary::LocaleVocabulary(const LocaleWords& words,
-                                   const platform::LocaleCase& folder)
+LocaleVocabulary::LocaleVocabulary(const LangInfo& words,
+                                   const platform::CaseFolder& folder)
     : folder_(folder) {
   for (std::size_t month = 0; month < words.month_names.size(); ++month) {
     for (const std::string& name : words.month_names[month]) {
@@ -304,7 +304,7 @@ int LocaleVocabulary::MatchAmPm(std::string_view text, std::size_t position,
 }
 
 std::optional<ReadingForm> CompileForm(std::string_view pattern,
-                                       const LocaleWords& words) {
+                                       const LangInfo& words) {
   FormBuilder builder(words);
   if (!builder.Append(pattern, 0)) return std::nullopt;
   ReadingForm form;

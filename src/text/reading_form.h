@@ -86,14 +86,14 @@ struct FormValues {
 // A locale's names, lowered for comparison in any case.
 class LocaleVocabulary {
  public:
-  LocaleVocabulary(const platform::LocaleWords& words,
-                   const platform::LocaleCase& folder);
+  LocaleVocabulary(const platform::LangInfo& words,
+                   const platform::CaseFolder& folder);
 
   bool has_am_pm() const { return !am_pm_.empty(); }
 
   // Reads texts with `folder` from now on: one of a locale with the same
   // character types as the one the names were lowered with.
-  void set_folder(const platform::LocaleCase& folder) { folder_ = folder; }
+  void set_folder(const platform::CaseFolder& folder) { folder_ = folder; }
 
   // The longest name of the list at `text[position]`: its number, and the bytes
   // it takes in `*length`; -1 when none is there.
@@ -108,7 +108,7 @@ class LocaleVocabulary {
   int Match(const NameList& list, std::string_view text, std::size_t position,
             std::size_t* length) const;
 
-  platform::LocaleCase folder_;
+  platform::CaseFolder folder_;
   NameList months_;    // 1 == January
   NameList weekdays_;  // 0 == Sunday
   NameList am_pm_;     // 0 AM, 1 PM
@@ -117,7 +117,7 @@ class LocaleVocabulary {
 // Compiles a pattern, writing out the locale's references from `words`.
 // Nothing for a pattern that gives no form (see the top of this file).
 std::optional<ReadingForm> CompileForm(std::string_view pattern,
-                                       const platform::LocaleWords& words);
+                                       const platform::LangInfo& words);
 
 // Reads `text` from `position` by the steps of `form`. On success moves
 // `*position` past what was read and fills `*values`.

@@ -1,3 +1,6 @@
+// Folder src/value/: the AdDateTime value (construction, status, setters,
+// fields), AdDuration, the arithmetic between them and the calendar members.
+//
 // Arithmetic on 32-bit counts that wraps modulo 2^32 instead of overflowing.
 #ifndef DATETIMELIB_VALUE_WRAP_H_
 #define DATETIMELIB_VALUE_WRAP_H_

@@ -1,3 +1,6 @@
+// Folder src/platform/civil/: Gregorian arithmetic only; no zone, no I/O, no C
+// library calls.
+//
 // Proleptic Gregorian calendar arithmetic, free of time zones.
 //
 // Days are counted from 1970-01-01 (day 0). The algorithms are the era-based ones

@@ -45,10 +45,10 @@ std::size_t DecodeUtf8(std::string_view text, std::size_t position, char32_t* co
 
 }  // namespace
 
-LocaleCase::LocaleCase(locale_t locale)
+CaseFolder::CaseFolder(locale_t locale)
     : locale_(locale), utf8_(std::strcmp(nl_langinfo_l(CODESET, locale), "UTF-8") == 0) {}
 
-std::size_t LocaleCase::ReadFolded(std::string_view text, std::size_t position,
+std::size_t CaseFolder::ReadFolded(std::string_view text, std::size_t position,
                                    char32_t* folded) const {
   if (position >= text.size()) return 0;
   if (!utf8_) {
@@ -64,7 +64,7 @@ std::size_t LocaleCase::ReadFolded(std::string_view text, std::size_t position,
   return length;
 }
 
-bool LocaleCase::Fold(std::string_view text, std::u32string* folded) const {
+bool CaseFolder::Fold(std::string_view text, std::u32string* folded) const {
   folded->clear();
   for (std::size_t position = 0; position < text.size();) {
     char32_t code = 0;

@@ -14,10 +14,10 @@
 
 namespace datetimelib::platform {
 
-class LocaleCase {
+class CaseFolder {
  public:
   // `locale` must outlive this object and must not be LC_GLOBAL_LOCALE.
-  explicit LocaleCase(locale_t locale);
+  explicit CaseFolder(locale_t locale);
 
   // Decodes the character at `text[position]` and lowers it into `*folded`.
   // Returns the bytes it takes, or 0 at the end of the text or at a byte

@@ -63,8 +63,8 @@ bool SameLocaleSourceTexts(const std::vector<std::string>& texts, locale_t local
   return true;
 }
 
-LocaleWords ReadLocaleWords(locale_t locale) {
-  LocaleWords words;
+LangInfo ReadLangInfo(locale_t locale) {
+  LangInfo words;
   words.date_form = Item(D_FMT, locale);
   words.time_form = Item(T_FMT, locale);
   words.date_time_form = Item(D_T_FMT, locale);

@@ -1,5 +1,5 @@
-// What a locale knows about writing dates: its date and time forms and its
-// names, as the C library holds them for that locale.
+// What nl_langinfo_l gives of a locale's time category: its date and time
+// patterns (%x, %X, %c, %r) and its names of months, weekdays and AM/PM.
 #ifndef DATETIMELIB_PLATFORM_LOCALE_LANGINFO_H_
 #define DATETIMELIB_PLATFORM_LOCALE_LANGINFO_H_
 
@@ -11,7 +11,7 @@
 
 namespace datetimelib::platform {
 
-struct LocaleWords {
+struct LangInfo {
   // strftime patterns of the locale; they may refer to one another (%r, %x).
   std::string date_form;       // %x, e.g. "%d.%m.%Y"
   std::string time_form;       // %X, e.g. "%H:%M:%S" or "%r"
@@ -27,11 +27,11 @@ struct LocaleWords {
   std::array<std::vector<std::string>, 7> weekday_names;
 };
 
-// The words of the time category of `locale`, which must not be LC_GLOBAL_LOCALE.
-LocaleWords ReadLocaleWords(locale_t locale);
+// The patterns and names of the time category of `locale`, which must not be LC_GLOBAL_LOCALE.
+LangInfo ReadLangInfo(locale_t locale);
 
 // The C library's texts that a locale's words and its case folding come from:
-// every item ReadLocaleWords reads, and the name and codeset of the character
+// every item ReadLangInfo reads, and the name and codeset of the character
 // types. Two locales with the same texts read and fold alike, so what was
 // compiled from one serves the other.
 std::vector<std::string> LocaleSourceTexts(locale_t locale);

@@ -1,3 +1,7 @@
+// Folder src/platform/locale/: the locale layer. Locale handles and identifiers,
+// langinfo patterns and names, case folding; the only callers of newlocale,
+// uselocale and nl_langinfo_l.
+//
 // An open C locale, owned or borrowed, for the *_l functions of the C library.
 //
 // Every handle carries the time category (names, date and time forms) and the

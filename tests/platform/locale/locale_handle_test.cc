@@ -67,10 +67,10 @@ TEST(LocaleHandle, ThreadLocaleOrProcessLocale) {
 
 // Characters are decoded whole and lowered (the text tests read month names in
 // any case); malformed UTF-8 does not fold.
-TEST(LocaleCase, RefusesMalformedUtf8) {
+TEST(CaseFolder, RefusesMalformedUtf8) {
   DATETIMELIB_NEED_TEST_LOCALES();
   const LocaleHandle german = LocaleHandle::ForIdentifier(1031);
-  const datetimelib::platform::LocaleCase folder(german.get());
+  const datetimelib::platform::CaseFolder folder(german.get());
   std::u32string folded;
   ASSERT_TRUE(folder.Fold("M\xC3\x84RZ \xF0\x9F\x98\x80", &folded));
   EXPECT_EQ(folded, U"m\u00E4rz \U0001F600");
