@@ -18,8 +18,10 @@
 // the member says GMT or UTC. A value holds 1970-01-01 through 2038-01-18.
 //
 // Values are plain objects with value semantics; the library keeps no reference to
-// any of them, starts no threads and holds no state between calls. Any member may
-// be called from many threads at once on distinct values.
+// any of them, starts no threads and takes no locks. The only state it keeps
+// between calls is each thread's own (its compiled zone, the locales it opened,
+// the reading forms of the locales it read in last), and none of it changes an
+// answer. Any member may be called from many threads at once on distinct values.
 //
 // Example:
 //

@@ -28,17 +28,17 @@ bool ParseLocaleDateTime(std::string_view text, DateTimeFields* out) {
 
 }  // namespace
 
+// A text that gives no value leaves its status and keeps the text as given; the
+// count stays as it was, or as the field constructor left it.
 int AdDateTime::ParseDateTime(const char* text, std::uint32_t /*flags*/) {
   const std::string_view input = text != nullptr ? text : "";
-  DateTimeFields fields;
-  if (!ParseLocaleDateTime(input, &fields)) {
+  DateTimeFields f;
+  if (!ParseLocaleDateTime(input, &f)) {
     status_ = invalid;
-    kept_text_.assign(input);
-    return 0;
+  } else {
+    SetDateTime(f.year, f.month, f.day, f.hour, f.minute, f.second);
+    if (status_ == valid) return 1;
   }
-  SetDateTime(fields.year, fields.month, fields.day, fields.hour, fields.minute,
-              fields.second);
-  if (status_ == valid) return 1;
   kept_text_.assign(input);
   return 0;
 }
@@ -48,21 +48,20 @@ int AdDateTime::ParseDateTimeGMT(const char* text) {
   DateTimeFields f;
   if (!ParseLocaleDateTime(input, &f)) {
     status_ = invalid;
-    kept_text_.assign(input);
-    return 0;
-  }
-  // No 1899-12-30 rule here: a time of day alone is out of range.
-  if (!Valid_Range(f.year, f.month, f.day, f.hour, f.minute, f.second)) {
+  } else if (!Valid_Range(f.year, f.month, f.day, f.hour, f.minute, f.second)) {
+    // No 1899-12-30 rule here: a time of day alone is out of range.
     status_ = outOfRange;
-    kept_text_.assign(input);
-    return 0;
+  } else {
+    // The reader gives real dates only, and the range test bounds them by
+    // 2038-01-18 23:59:59 (2 147 471 999 s), so the count fits in 32 bits.
+    const std::int64_t days =
+        datetimelib::platform::DaysFromCivil(f.year, f.month, f.day);
+    seconds_ = static_cast<std::int32_t>(days * datetimelib::platform::kSecondsPerDay +
+                                         f.hour * 3600 + f.minute * 60 + f.second);
+    status_ = valid;
+    kept_text_.clear();
+    return 1;
   }
-  // The reader gives real dates only, and the range test bounds them by
-  // 2038-01-18 23:59:59 (2 147 471 999 s), so the count fits in 32 bits.
-  const std::int64_t days = datetimelib::platform::DaysFromCivil(f.year, f.month, f.day);
-  seconds_ = static_cast<std::int32_t>(days * datetimelib::platform::kSecondsPerDay +
-                                       f.hour * 3600 + f.minute * 60 + f.second);
-  status_ = valid;
-  kept_text_.clear();
-  return 1;
+  kept_text_.assign(input);
+  return 0;
 }

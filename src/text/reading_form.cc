@@ -1,6 +1,7 @@
 #include "text/reading_form.h"
 
 #include <array>
+#include <iterator>
 
 #include "platform/ascii.h"
 
@@ -209,26 +210,27 @@ void SkipBlanks(std::string_view text, std::size_t* position) {
   while (*position < text.size() && IsBlank(text[*position])) ++*position;
 }
 
+// The field each step reads, in the order of FormStep; none for blanks and
+// literals.
+constexpr int FormValues::*kFieldOfStep[] = {nullptr,
+                                             nullptr,
+                                             nullptr,  // literal, blanks
+                                             &FormValues::year,
+                                             &FormValues::year,  // %Y, %y
+                                             &FormValues::month,
+                                             &FormValues::month,
+                                             &FormValues::day,  // %m, %b, %d
+                                             &FormValues::hour,
+                                             &FormValues::hour12,
+                                             &FormValues::minute,
+                                             &FormValues::second,
+                                             &FormValues::pm,
+                                             &FormValues::weekday};
+static_assert(std::size(kFieldOfStep) ==
+              static_cast<std::size_t>(FormStep::kWeekdayName) + 1);
+
 int* FieldOf(FormStep step, FormValues* values) {
-  switch (step) {
-    case FormStep::kYear4:
-    case FormStep::kYear2:
-      return &values->year;
-    case FormStep::kMonth:
-      return &values->month;
-    case FormStep::kDay:
-      return &values->day;
-    case FormStep::kHour:
-      return &values->hour;
-    case FormStep::kHour12:
-      return &values->hour12;
-    case FormStep::kMinute:
-      return &values->minute;
-    case FormStep::kSecond:
-      return &values->second;
-    default:
-      return nullptr;
-  }
+  return &(values->*kFieldOfStep[static_cast<std::size_t>(step)]);
 }
 
 }  // namespace
@@ -263,8 +265,11 @@ void LocaleVocabulary::Add(std::string_view name, int number, NameList* list) co
   }
 }
 
-int LocaleVocabulary::Match(const NameList& list, std::string_view text,
-                            std::size_t position, std::size_t* length) const {
+int LocaleVocabulary::Match(FormStep step, std::string_view text, std::size_t position,
+                            std::size_t* length) const {
+  const NameList& list = step == FormStep::kMonthName     ? months_
+                         : step == FormStep::kWeekdayName ? weekdays_
+                                                          : am_pm_;
   int found = -1;
   std::size_t longest = 0;
   for (const auto& [name, number] : list) {
@@ -288,23 +293,7 @@ int LocaleVocabulary::Match(const NameList& list, std::string_view text,
   return found;
 }
 
-int LocaleVocabulary::MatchMonth(std::string_view text, std::size_t position,
-                                 std::size_t* length) const {
-  return Match(months_, text, position, length);
-}
-
-int LocaleVocabulary::MatchWeekday(std::string_view text, std::size_t position,
-                                   std::size_t* length) const {
-  return Match(weekdays_, text, position, length);
-}
-
-int LocaleVocabulary::MatchAmPm(std::string_view text, std::size_t position,
-                                std::size_t* length) const {
-  return Match(am_pm_, text, position, length);
-}
-
-std::optional<ReadingForm> CompileForm(std::string_view pattern,
-                                       const LangInfo& words) {
+std::optional<ReadingForm> CompileForm(std::string_view pattern, const LangInfo& words) {
   FormBuilder builder(words);
   if (!builder.Append(pattern, 0)) return std::nullopt;
   ReadingForm form;
@@ -339,20 +328,14 @@ bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
         read.year += read.year < 69 ? 2000 : 1900;
         break;
       case FormStep::kMonthName:
-        read.month = vocabulary.MatchMonth(text, at, &length);
-        if (read.month < 0) return false;
-        at += length;
-        break;
       case FormStep::kWeekdayName:
-        read.weekday = vocabulary.MatchWeekday(text, at, &length);
-        if (read.weekday < 0) return false;
+      case FormStep::kAmPm: {
+        int* const field = FieldOf(token.step, &read);
+        *field = vocabulary.Match(token.step, text, at, &length);
+        if (*field < 0) return false;
         at += length;
         break;
-      case FormStep::kAmPm:
-        read.pm = vocabulary.MatchAmPm(text, at, &length);
-        if (read.pm < 0) return false;
-        at += length;
-        break;
+      }
       default:  // a one- or two-digit number
         if (token.blank_padded) SkipBlanks(text, &at);
         if (!ReadDigits(text, &at, 1, 2, FieldOf(token.step, &read))) return false;

@@ -86,32 +86,26 @@ struct FormValues {
 // A locale's names, lowered for comparison in any case.
 class LocaleVocabulary {
  public:
-  LocaleVocabulary(const platform::LangInfo& words,
-                   const platform::CaseFolder& folder);
-
-  bool has_am_pm() const { return !am_pm_.empty(); }
+  LocaleVocabulary(const platform::LangInfo& words, const platform::CaseFolder& folder);
 
   // Reads texts with `folder` from now on: one of a locale with the same
   // character types as the one the names were lowered with.
   void set_folder(const platform::CaseFolder& folder) { folder_ = folder; }
 
-  // The longest name of the list at `text[position]`: its number, and the bytes
-  // it takes in `*length`; -1 when none is there.
-  int MatchMonth(std::string_view text, std::size_t position, std::size_t* length) const;
-  int MatchWeekday(std::string_view text, std::size_t position,
-                   std::size_t* length) const;
-  int MatchAmPm(std::string_view text, std::size_t position, std::size_t* length) const;
+  // The longest name that `step` (kMonthName, kWeekdayName or kAmPm) reads at
+  // `text[position]`: its number (1 == January; 0 == Sunday; 0 AM, 1 PM), and
+  // the bytes it takes in `*length`; -1 when none is there.
+  int Match(FormStep step, std::string_view text, std::size_t position,
+            std::size_t* length) const;
 
  private:
   using NameList = std::vector<std::pair<std::u32string, int>>;  // lowered name, number
   void Add(std::string_view name, int number, NameList* list) const;
-  int Match(const NameList& list, std::string_view text, std::size_t position,
-            std::size_t* length) const;
 
   platform::CaseFolder folder_;
-  NameList months_;    // 1 == January
-  NameList weekdays_;  // 0 == Sunday
-  NameList am_pm_;     // 0 AM, 1 PM
+  NameList months_;
+  NameList weekdays_;
+  NameList am_pm_;
 };
 
 // Compiles a pattern, writing out the locale's references from `words`.
