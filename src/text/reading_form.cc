@@ -212,20 +212,22 @@ void SkipBlanks(std::string_view text, std::size_t* position) {
 
 // The field each step reads, in the order of FormStep; none for blanks and
 // literals.
-constexpr int FormValues::*kFieldOfStep[] = {nullptr,
-                                             nullptr,
-                                             nullptr,  // literal, blanks
-                                             &FormValues::year,
-                                             &FormValues::year,  // %Y, %y
-                                             &FormValues::month,
-                                             &FormValues::month,
-                                             &FormValues::day,  // %m, %b, %d
-                                             &FormValues::hour,
-                                             &FormValues::hour12,
-                                             &FormValues::minute,
-                                             &FormValues::second,
-                                             &FormValues::pm,
-                                             &FormValues::weekday};
+constexpr int FormValues::*kFieldOfStep[] = {
+    nullptr,               // kLiteral
+    nullptr,               // kBlanks
+    nullptr,               // kAnyBlanks
+    &FormValues::year,     // kYear4
+    &FormValues::year,     // kYear2
+    &FormValues::month,    // kMonth
+    &FormValues::month,    // kMonthName
+    &FormValues::day,      // kDay
+    &FormValues::hour,     // kHour
+    &FormValues::hour12,   // kHour12
+    &FormValues::minute,   // kMinute
+    &FormValues::second,   // kSecond
+    &FormValues::pm,       // kAmPm
+    &FormValues::weekday,  // kWeekdayName
+};
 static_assert(std::size(kFieldOfStep) ==
               static_cast<std::size_t>(FormStep::kWeekdayName) + 1);
 
