@@ -25,12 +25,15 @@ OPERATIONS = {
     "ParseLocal": ("ParseDateTime canonical", 0.5, "StrptimeMktime"),
     "ParseGmt": ("ParseDateTimeGMT canonical", 0.3, "StrptimeTimegm"),
     "ParseCompact": ("ParseTolvaneDateTime", 1.0, "StrptimeMktime"),
+    "GmtOffset": ("GetGMTOffset", 2.0, "TzsetTimezone"),
+    "UsesDst": ("UsesDST", 2.0, "TzsetDaylight"),
 }
 # Targets that name one peer rather than the fastest of them.
 TARGET_PEER = {"Compose": "Abseil", "Breakdown": "Date", "FormatLocal": "LocaltimeStrftime",
                "FormatCompact": "LocaltimeStrftime", "FormatGmt": "GmtimeStrftime",
                "ParseLocal": "StrptimeMktime", "ParseGmt": "StrptimeTimegm",
-               "ParseCompact": "StrptimeMktime"}
+               "ParseCompact": "StrptimeMktime", "GmtOffset": "TzsetTimezone",
+               "UsesDst": "TzsetDaylight"}
 
 
 def run(binary, zone, repetitions, min_time):
