@@ -16,7 +16,7 @@
 //
 // A locale form with a two-digit year (%y) is also read with four digits; a
 // locale whose forms write four digits reads no two-digit years. What
-// each step of a form accepts is set out in locale_form.h. Fields that no
+// each step of a form accepts is set out in reading_form.h. Fields that no
 // calendar has (30 February, hour 24, second 60) are refused, as is a weekday
 // name that is not the weekday of the date.
 #ifndef DATETIMELIB_TEXT_LOCALE_FORMS_H_

@@ -38,7 +38,7 @@ class LocaleHandle {
   // "C".
   static LocaleHandle Invariant();
 
-  // The locale a locale identifier names (see locale_names.h); "C" for unknown
+  // The locale a locale identifier names (see locale_ids.h); "C" for unknown
   // identifiers and for locales that are not installed.
   static LocaleHandle ForIdentifier(std::uint32_t identifier);
 
