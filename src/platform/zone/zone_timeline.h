@@ -7,7 +7,8 @@
 // The periods hold the zone's transitions and, for a zone ruled by a POSIX rule
 // (a rule string in TZ, or a zone file's footer after its last transition), the
 // rule's changes up to 2100; beyond that the rule is evaluated for each instant.
-// Lookups are a binary search over the periods.
+// Lookups go through a bucket index over the periods (see below), else a binary
+// search.
 #ifndef DATETIMELIB_PLATFORM_ZONE_ZONE_TIMELINE_H_
 #define DATETIMELIB_PLATFORM_ZONE_ZONE_TIMELINE_H_
 
