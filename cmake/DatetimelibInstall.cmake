@@ -59,3 +59,4 @@ configure_file(${CMAKE_CURRENT_LIST_DIR}/datetimelib.pc.in
 install(FILES ${PROJECT_BINARY_DIR}/datetimelib.pc
   DESTINATION ${DATETIMELIB_PC_DIR}
   COMPONENT development)
+include(${CMAKE_CURRENT_LIST_DIR}/DatetimelibPackaging.cmake)

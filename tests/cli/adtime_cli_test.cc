@@ -3,9 +3,11 @@
 // errors, batch mode and the escaping of hostile input.
 #include <gtest/gtest.h>
 #include <sys/wait.h>
+#include <unistd.h>
 
 #include <cstdio>
 #include <cstdlib>
+#include <climits>
 #include <ctime>
 #include <fstream>
 #include <sstream>
@@ -191,6 +193,44 @@ TEST(AdtimeUsage, EveryCommandHasHelp) {
     EXPECT_EQ(result.exit_status, 0) << name;
     EXPECT_EQ(result.out.rfind("Usage: adtime " + name, 0), 0u) << name;
   }
+}
+
+// --version names the library the loader mapped, not the one adtime was built
+// with: a copy under a later release's file name, behind the same SONAME link and
+// found first through LD_LIBRARY_PATH, is the one reported.
+TEST(AdtimeVersion, NamesTheLoadedLibraryItsVersionAndSoname) {
+  const std::string linker_name = ADTIME_LIBRARY_LINKER_NAME;
+  const std::string soname = ADTIME_LIBRARY_SONAME;
+  char built[PATH_MAX];
+  ASSERT_NE(realpath(ADTIME_LIBRARY_FILE, built), nullptr);
+  const std::string built_path = built;
+  const std::string built_version =
+      built_path.substr(built_path.rfind('/') + 1 + linker_name.size() + 1);
+
+  char dir[] = "/tmp/adtime_library_XXXXXX";
+  ASSERT_NE(mkdtemp(dir), nullptr);
+  const std::string upgraded = std::string(dir) + "/" + soname + ".99";
+  std::ofstream(upgraded, std::ios::binary) << std::ifstream(built_path, std::ios::binary).rdbuf();
+  const std::string link = std::string(dir) + "/" + soname;
+  ASSERT_EQ(symlink(upgraded.c_str(), link.c_str()), 0);
+
+  const struct {
+    Args environment;
+    std::string library_line;
+  } cases[] = {
+      {{}, linker_name + " " + built_version + " (SONAME " + soname + ") from " + built_path},
+      {{std::string("LD_LIBRARY_PATH=") + dir},
+       linker_name + " " + soname.substr(linker_name.size() + 1) + ".99 (SONAME " + soname +
+           ") from " + upgraded},
+  };
+  for (const auto& row : cases) {
+    const RunResult result = RunAdtime({"--version"}, {"", row.environment});
+    EXPECT_EQ(result.exit_status, 0) << result.err;
+    EXPECT_EQ(result.out, "adtime " ADTIME_TOOL_VERSION "\n" + row.library_line + "\n");
+  }
+  std::remove(link.c_str());
+  std::remove(upgraded.c_str());
+  std::remove(dir);
 }
 
 TEST(AdtimeBatch, WritesOneResultPerInputLineWhateverTheLineHolds) {

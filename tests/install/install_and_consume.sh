@@ -2,13 +2,23 @@
 # Installs a build into a temporary prefix, moves the installed tree (it must not
 # depend on where it was installed), then builds the example host application
 # against it through find_package and through pkg-config, runs both, and runs
-# the installed adtime.
+# the installed adtime and its manual page.
 #
 #   tests/install/install_and_consume.sh [BUILD_DIR]   (default: build/default)
+#   tests/install/install_and_consume.sh --prefix DIR
+#
+# With --prefix, DIR is an installed tree taken as it is, such as the usr/ of
+# unpacked Debian packages; its adtime has no run path, as a system's has none,
+# and finds the library through LD_LIBRARY_PATH.
 set -euo pipefail
 
 root=$(cd "$(dirname "$0")/../.." && pwd)
-build=${1:-$root/build/default}
+prefix=""
+if [[ "${1:-}" == --prefix ]]; then
+  prefix=$(cd "$2" && pwd)
+else
+  build=${1:-$root/build/default}
+fi
 work=$(mktemp -d)
 trap 'rm -rf "$work"' EXIT
 
@@ -27,9 +37,12 @@ expect_output() {
   echo "ok: $what"
 }
 
-cmake --install "$build" --prefix "$work/staged" >/dev/null
-mv "$work/staged" "$work/prefix"
-prefix=$work/prefix
+if [[ -z "$prefix" ]]; then
+  cmake --install "$build" --prefix "$work/staged" >/dev/null
+  mv "$work/staged" "$work/prefix"
+  prefix=$work/prefix
+  run_tool=("$prefix/bin/adtime")
+fi
 
 pc_file=$(find "$prefix" -name datetimelib.pc)
 [[ -n "$pc_file" ]] || fail "no datetimelib.pc installed"
@@ -37,6 +50,7 @@ libdir=$(dirname "$(dirname "$pc_file")")
 [[ -f "$prefix/include/AdDateTime.h" ]] || fail "no AdDateTime.h installed"
 [[ -L "$libdir/libdatetimelib.so" ]] || fail "no libdatetimelib.so development link"
 soname=$(objdump -p "$libdir/libdatetimelib.so" | awk '$1 == "SONAME" { print $2 }')
+[[ -v run_tool ]] || run_tool=(env LD_LIBRARY_PATH="$libdir" "$prefix/bin/adtime")
 [[ -L "$libdir/$soname" ]] || fail "no $soname link for the SONAME"
 echo "ok: library, SONAME link $soname, header and package files installed"
 
@@ -65,4 +79,18 @@ expect_output "example built with pkg-config" "$expected" \
   "$("$work/with-pkg-config" "05-Mar-2007.09:30")"
 
 expect_output "installed adtime" \
-  "05-Mar-2007.09:30:00" "$("$prefix/bin/adtime" compact 1173105000)"
+  "05-Mar-2007.09:30:00" "$("${run_tool[@]}" compact 1173105000)"
+real_library=$(readlink -f "$libdir/$soname")
+expect_output "installed adtime --version" \
+  "libdatetimelib.so ${real_library##*/libdatetimelib.so.} (SONAME $soname) from $real_library" \
+  "$("${run_tool[@]}" --version | sed -n 2p)"
+
+page=$prefix/share/man/man1/adtime.1.gz
+[[ -f "$page" ]] || fail "no manual page $page"
+if command -v man >/dev/null; then
+  MANPATH=$prefix/share/man MANWIDTH=80 man adtime 2>"$work/man-warnings" >"$work/man-page" ||
+    fail "man adtime failed: $(cat "$work/man-warnings")"
+  [[ ! -s "$work/man-warnings" ]] || fail "man adtime warned: $(cat "$work/man-warnings")"
+  grep -q "^EXIT STATUS" "$work/man-page" || fail "man adtime shows no EXIT STATUS section"
+  echo "ok: man adtime"
+fi

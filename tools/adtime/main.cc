@@ -9,6 +9,7 @@
 #include "command_line.h"
 #include "commands.h"
 #include "escape.h"
+#include "loaded_library.h"
 
 namespace {
 
@@ -29,7 +30,8 @@ constexpr const char kHelp[] =
     "  zone                       the time zone: offset, daylight saving, its dates\n"
     "  dst YEAR...                daylight-saving start and end of years\n"
     "\n"
-    "Run 'adtime COMMAND --help' for the options of a command.\n"
+    "Run 'adtime COMMAND --help' for the options of a command, 'adtime --version'\n"
+    "for the versions of the tool and of the library it runs with.\n"
     "\n"
     "Exit status: 0 when every input was valid, 1 when any was not, 2 for a usage\n"
     "error or an output that could not be written (the reason on standard error).\n";
@@ -61,7 +63,12 @@ int main(int argc, char** argv) {
   const std::string name = argv[1];
   if (name == "--help" || name == "-h" || name == "help") return adtime::PrintHelp(kHelp);
   if (name == "--version") {
-    std::puts("adtime " ADTIME_VERSION);
+    // The library may have been upgraded on its own: name the one loaded.
+    const adtime::LoadedLibrary library = adtime::FindLoadedLibrary(ADTIME_LIBRARY_NAME);
+    std::printf("adtime %s\n%s %s (SONAME %s) from %s\n", ADTIME_VERSION, ADTIME_LIBRARY_NAME,
+                library.version.empty() ? "unknown" : library.version.c_str(),
+                library.soname.empty() ? "unknown" : library.soname.c_str(),
+                library.path.empty() ? "an unknown file" : library.path.c_str());
     return 0;
   }
   const std::vector<std::string> args(argv + 2, argv + argc);
