@@ -25,6 +25,32 @@ TEST(Civil, FastFieldsAgreeWithGeneral) {
   }
 }
 
+// Beyond the 32-bit forms' range, the general algorithms give gmtime_r's fields;
+// within 1600..2400, every day converts to its date and back.
+TEST(Civil, GeneralFieldsAgreeWithGmtime) {
+  for (const std::int64_t t : {kFastCivilSecondsLimit + 3661,
+                               -kFastCivilSecondsLimit - 7322, std::int64_t{1} << 40}) {
+    const time_t value = static_cast<time_t>(t);
+    std::tm expected{};
+    gmtime_r(&value, &expected);
+    const CivilFields got = CivilFieldsOf(t);
+    EXPECT_EQ(got.date.year, expected.tm_year + 1900) << t;
+    EXPECT_EQ(got.date.month * 100 + got.date.day,
+              (expected.tm_mon + 1) * 100 + expected.tm_mday);
+    EXPECT_EQ(got.hour * 3600 + got.minute * 60 + got.second,
+              expected.tm_hour * 3600 + expected.tm_min * 60 + expected.tm_sec)
+        << t;
+    EXPECT_EQ(got.weekday * 1000 + got.yearday,
+              expected.tm_wday * 1000 + expected.tm_yday);
+  }
+  for (std::int64_t days = DaysFromCivil(1600, 1, 1); days < DaysFromCivil(2401, 1, 1);
+       ++days) {
+    const CivilDay date = CivilFromDays(days);
+    ASSERT_EQ(DaysFromCivil(date.year, date.month, date.day), days);
+    ASSERT_LE(date.day, DaysInMonth(date.year, date.month)) << days;
+  }
+}
+
 // Fields carry as timegm carries them; fields too large for any count are
 // refused, not overflowed.
 TEST(Civil, SecondsCarryLikeTimegm) {
@@ -49,8 +75,20 @@ TEST(Civil, SecondsCarryLikeTimegm) {
   }
   EXPECT_FALSE(
       CivilSeconds(INT64_MAX, INT64_MAX, INT64_MAX, INT64_MAX, INT64_MAX, INT64_MAX));
-  // Huge fields that cancel are still exact (the 128-bit path).
-  EXPECT_EQ(CivilSeconds(1970, 1, 1, 1000000000000LL, -60000000000000LL, 0), 0);
+  // Fields beyond 32 bits that cancel take the 128-bit path: the same counts, and
+  // the same limit of 2^40 seconds either way.
+  constexpr std::int64_t kWide = std::int64_t{1} << 40;
+  for (std::int64_t year = 1599; year <= 2401; ++year) {
+    for (const int month : {-1, 0, 1, 2, 3, 12, 14}) {
+      ASSERT_EQ(CivilSeconds(year, month, 1, kWide, -60 * kWide, 0),
+                CivilSeconds(year, month, 1, 0, 0, 0))
+          << year << "/" << month;
+    }
+  }
+  EXPECT_EQ(CivilSeconds(1970, 1, 1, 0, 0, kWide - 1), kWide - 1);
+  EXPECT_EQ(CivilSeconds(1970, 1, 1, 0, 0, 1 - kWide), 1 - kWide);
+  EXPECT_FALSE(CivilSeconds(1970, 1, 1, 0, 0, kWide));
+  EXPECT_FALSE(CivilSeconds(1970, 1, 1, 0, 0, -kWide));
 }
 
 }  // namespace
