@@ -24,14 +24,8 @@ std::string DateForm(const LocaleHandle& handle) {
 constexpr const char* kJapanese = "%Y年%m月%d日";
 
 TEST(LanguageRegionName, NamedNumbersAndOthers) {
-  const std::pair<std::uint32_t, const char*> named[] = {
-      {1033, "en_US"}, {2057, "en_GB"}, {1031, "de_DE"}, {1036, "fr_FR"},
-      {1040, "it_IT"}, {3082, "es_ES"}, {1043, "nl_NL"}, {1046, "pt_BR"},
-      {1049, "ru_RU"}, {1041, "ja_JP"}, {2052, "zh_CN"}, {1042, "ko_KR"}};
-  for (const auto& [identifier, name] : named) {
-    EXPECT_STREQ(datetimelib::platform::LanguageRegionName(identifier), name)
-        << identifier;
-  }
+  EXPECT_STREQ(datetimelib::platform::LanguageRegionName(1033), "en_US");
+  EXPECT_STREQ(datetimelib::platform::LanguageRegionName(2052), "zh_CN");
   // Not in the table: the special numbers, a language without a region, bits
   // above 16.
   for (const std::uint32_t identifier :

@@ -5,6 +5,7 @@
 #include <cstring>
 #include <ctime>
 #include <filesystem>
+#include <fstream>
 #include <map>
 #include <sstream>
 #include <utility>
@@ -29,27 +30,22 @@ std::tm Libc(std::int64_t t) {
 
 std::string Describe(std::int64_t t, const std::tm& expected,
                      const platform::BrokenDownTime& got) {
-  std::ostringstream out;
-  out << "t=" << t << " glibc " << expected.tm_year + 1900 << "-" << expected.tm_mon + 1
-      << "-" << expected.tm_mday << " " << expected.tm_hour << ":" << expected.tm_min
-      << ":" << expected.tm_sec << " off=" << expected.tm_gmtoff
-      << " dst=" << expected.tm_isdst << " " << expected.tm_zone << " | ours " << got.year
-      << "-" << got.month << "-" << got.day << " " << got.hour << ":" << got.minute << ":"
-      << got.second << " off=" << got.utc_offset << " dst=" << got.is_dst << " "
-      << got.abbreviation;
-  return out.str();
+  char text[256];
+  std::snprintf(text, sizeof text,
+                "t=%lld glibc %d-%d-%d %d:%d:%d off=%ld dst=%d %s | ours %d-%d-%d "
+                "%d:%d:%d off=%d dst=%d %s",
+                static_cast<long long>(t), expected.tm_year + 1900, expected.tm_mon + 1,
+                expected.tm_mday, expected.tm_hour, expected.tm_min, expected.tm_sec,
+                expected.tm_gmtoff, expected.tm_isdst, expected.tm_zone, got.year,
+                got.month, got.day, got.hour, got.minute, got.second, got.utc_offset,
+                got.is_dst, got.abbreviation);
+  return text;
 }
 
 std::string ReadFile(const std::string& path) {
-  std::string bytes;
-  if (std::FILE* file = std::fopen(path.c_str(), "rb")) {
-    char chunk[4096];
-    std::size_t count;
-    while ((count = std::fread(chunk, 1, sizeof chunk, file)) > 0)
-      bytes.append(chunk, count);
-    std::fclose(file);
-  }
-  return bytes;
+  std::ostringstream bytes;
+  bytes << std::ifstream(path, std::ios::binary).rdbuf();
+  return bytes.str();
 }
 
 void Note(AgreementReport* report, std::string what) {
@@ -95,17 +91,11 @@ struct Change {
   std::int64_t offset_after;
 };
 
+// The fields of local seconds `civil` (counted as if UTC), for mktime.
 std::tm MktimeFields(std::int64_t civil) {
-  const std::int64_t days = platform::FloorDiv(civil, 86400);
-  const std::int64_t second_of_day = civil - days * 86400;
-  const platform::CivilDay date = platform::CivilFromDays(days);
+  const time_t value = static_cast<time_t>(civil);
   std::tm fields{};
-  fields.tm_year = static_cast<int>(date.year) - 1900;
-  fields.tm_mon = date.month - 1;
-  fields.tm_mday = date.day;
-  fields.tm_hour = static_cast<int>(second_of_day / 3600);
-  fields.tm_min = static_cast<int>(second_of_day / 60 % 60);
-  fields.tm_sec = static_cast<int>(second_of_day % 60);
+  gmtime_r(&value, &fields);
   fields.tm_isdst = -1;
   return fields;
 }
