@@ -31,6 +31,8 @@ TEST(RegularFile, IdentitySurvivesOpeningAndMoving) {
   ASSERT_TRUE(assigned.has_value());
   *assigned = std::move(moved);
   EXPECT_EQ(assigned->Identity(), *named);
+  char buffer[8];
+  EXPECT_EQ(assigned->Read(buffer, sizeof buffer), 5);  // the moved descriptor, open
 }
 
 }  // namespace

@@ -99,7 +99,8 @@ TEST(ReadInLocale, Forms) {
       {kInvariant, "12/31/69", "1969-12-31 00:00:00"},
       {kInvariant, "01/01/68", "2068-01-01 00:00:00"},
       {kInvariant, "Sat May 17 14:03:09 2003", "2003-05-17 14:03:09"},
-      {kInvariant, "Sun May 17 14:03:09 2003", "refused"},  // a Saturday
+      {kInvariant, "Sun May 17 14:03:09 2003", "refused"},      // a Saturday
+      {kInvariant, "January May 18 14:03:09 2003", "refused"},  // no weekday
       {kInvariant, "May 17, 2003 2:30 PM", "2003-05-17 14:30:00"},
       // en_US: %x "%m/%d/%Y", %c "%a %d %b %Y %r %Z"; no zone is read.
       {kEnUs, "Sat 17 May 2003 02:03:09 PM", "2003-05-17 14:03:09"},
