@@ -52,13 +52,15 @@ TEST(TzWatch, NoticesEveryWayTzChanges) {
       {[] { putenv(tz_entry); }, "UTC0"},
       // putenv's string changed in place.
       {[] { std::memcpy(tz_entry, "TZ=EST5", 7); }, "EST5"},
+      // unsetenv: nothing left of the value read before.
+      {[] { unsetenv("TZ"); }, "(unset)"},
   };
   for (const auto& step : steps) {
     ASSERT_TRUE(watch.Unchanged());
     step.change();
     EXPECT_FALSE(watch.Unchanged()) << step.tz;
     watch.Refresh();
-    EXPECT_EQ(watch.value(), step.tz);
+    EXPECT_EQ(watch.value().value_or("(unset)"), step.tz);
   }
 }
 

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <ctime>
 #include <filesystem>
 #include <thread>
 
@@ -27,6 +28,7 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
       "Africa/Casablanca",               // daylight time suspended each Ramadan
       "Pacific/Apia",                    // skipped a whole day in 2011
       "Asia/Kolkata",                    // fractional offset, no DST since 1945
+      "Asia/Kathmandu",                  // "+0545": a quarter-hour offset, named by it
       "America/Sao_Paulo",               // DST abolished in 2019
       "Europe/Moscow",                   // permanent summer time 2011-2014
       "Etc/GMT-14",                      // no transitions at all
@@ -37,6 +39,7 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
       "XXX3YYY,J60/0,J300/25",            // Julian days without 29 February
       "ZZZ-12:45ZZY,0/0,364/-3",          // zero-based days, negative time
       "<+0530>-5:30",                     // no DST, quoted name
+      "XST-1XDT0,M10.5.0/3,M3.5.0/3",     // winter as daylight time; gaps at 03:00
       "Foo/Bar",                          // unreadable: UTC named "Foo"
       "",                                 // empty: UTC
   };
@@ -45,6 +48,23 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
     const auto report = datetimelib::testing::CheckAgreementWithGlibc(zone, 3);
     EXPECT_GT(report.instants_checked, 190000);
     EXPECT_TRUE(report.mismatches.empty()) << report.mismatches.front();
+  }
+}
+
+// Past 2100 the rule answers rather than the periods laid out for it: still
+// localtime_r's offsets, from the first instant of 2100 on (a change falls on it
+// in the second zone).
+TEST(ZoneEngine, AgreesWithGlibcPastTheLaidOutPeriods) {
+  constexpr std::int64_t k2100 = 4102444800;
+  for (const char* zone : {"America/New_York", "XST0XDT-1,J1/0,J60/0"}) {
+    TzGuard tz(zone);
+    for (std::int64_t t = k2100 - 3; t < k2100 + 400 * 86400;
+         t += t < k2100 + 3 ? 1 : 86399) {
+      const std::time_t instant = static_cast<std::time_t>(t);
+      std::tm libc{};
+      localtime_r(&instant, &libc);
+      ASSERT_EQ(BreakDownLocal(t).utc_offset, libc.tm_gmtoff) << zone << " " << t;
+    }
   }
 }
 
