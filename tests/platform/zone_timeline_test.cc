@@ -41,6 +41,7 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
       "<+0530>-5:30",                     // no DST, quoted name
       "XST-1XDT0,M10.5.0/3,M3.5.0/3",     // winter as daylight time; gaps at 03:00
       "Foo/Bar",                          // unreadable: UTC named "Foo"
+      ":Foo/Bar",                         // the same after the ":"
       "",                                 // empty: UTC
   };
   for (const char* zone : zones) {
@@ -64,6 +65,22 @@ TEST(ZoneEngine, AgreesWithGlibcPastTheLaidOutPeriods) {
       std::tm libc{};
       localtime_r(&instant, &libc);
       ASSERT_EQ(BreakDownLocal(t).utc_offset, libc.tm_gmtoff) << zone << " " << t;
+    }
+  }
+  // Local times of 2101 every half hour, gaps and folds included, as mktime
+  // composes them; a repeated one at its first instant, which mktime may not give.
+  for (const char* zone : {"America/New_York", "XST-1XDT0,M10.5.0/3,M3.5.0/3"}) {
+    TzGuard tz(zone);
+    for (std::int64_t civil = k2100 + 365 * 86400; civil < k2100 + 730 * 86400;
+         civil += 1800) {
+      const std::time_t as_utc = static_cast<std::time_t>(civil);
+      std::tm fields{};
+      gmtime_r(&as_utc, &fields);
+      fields.tm_isdst = -1;
+      const std::int64_t expected = mktime(&fields), ours = ComposeLocal(civil);
+      if (ours == expected) continue;
+      ASSERT_LT(ours, expected) << zone << " " << civil;
+      ASSERT_EQ(ours + BreakDownLocal(ours).utc_offset, civil) << zone << " " << civil;
     }
   }
 }
