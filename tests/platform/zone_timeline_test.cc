@@ -52,20 +52,27 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
   }
 }
 
-// Past 2100 the rule answers rather than the periods laid out for it: still
-// localtime_r's offsets, from the first instant of 2100 on (a change falls on it
-// in the second zone).
+// Beyond 2038 the footer rule answers, as periods laid out up to 2100 and per
+// instant past them: still localtime_r's offsets, from the first instant of
+// 2100 on (a change falls on it in the second zone); and the first type before
+// a zone file's first transition (1800).
 TEST(ZoneEngine, AgreesWithGlibcPastTheLaidOutPeriods) {
-  constexpr std::int64_t k2100 = 4102444800;
+  constexpr std::int64_t k2100 = 4102444800, k2045 = 2366841600;
   for (const char* zone : {"America/New_York", "XST0XDT-1,J1/0,J60/0"}) {
     TzGuard tz(zone);
-    for (std::int64_t t = k2100 - 3; t < k2100 + 400 * 86400;
-         t += t < k2100 + 3 ? 1 : 86399) {
-      const std::time_t instant = static_cast<std::time_t>(t);
-      std::tm libc{};
-      localtime_r(&instant, &libc);
-      ASSERT_EQ(BreakDownLocal(t).utc_offset, libc.tm_gmtoff) << zone << " " << t;
+    for (const std::int64_t from : {k2045, k2100 - 3}) {
+      for (std::int64_t t = from; t < from + 400 * 86400;
+           t += t >= k2100 - 3 && t < k2100 + 3 ? 1 : 86399) {
+        const std::time_t instant = static_cast<std::time_t>(t);
+        std::tm libc{};
+        localtime_r(&instant, &libc);
+        ASSERT_EQ(BreakDownLocal(t).utc_offset, libc.tm_gmtoff) << zone << " " << t;
+      }
     }
+    const std::time_t in_1800 = -5364662400;
+    std::tm libc{};
+    localtime_r(&in_1800, &libc);
+    EXPECT_EQ(BreakDownLocal(in_1800).utc_offset, libc.tm_gmtoff) << zone;
   }
   // Local times of 2101 every half hour, gaps and folds included, as mktime
   // composes them; a repeated one at its first instant, which mktime may not give.
