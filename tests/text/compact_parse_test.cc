@@ -107,6 +107,7 @@ TEST(ParseTolvaneDateTime, Outcomes) {
     const char* part;
     std::vector<const char*> texts;
   } refused[] = {
+      {"split", {".10:00", "05-Jan-2003."}},
       {"words", {"now ", "now.10:00", "tomorrow", "today ", "Thurs"}},
       {"day-month", {"-05-Jan", "05-", "05--2003", "05-Jan-"}},
       {"day", {"32-Jan-2003", "x5-Jan-2003", "005-Jan-2003"}},

@@ -12,6 +12,7 @@
 #include "platform/locale_handle.h"
 #include "support/test_locales.h"
 #include "text/canonical_text.h"
+#include "text/locale_form.h"
 
 namespace {
 
@@ -101,11 +102,13 @@ TEST(ReadInLocale, Forms) {
       {kInvariant, "Sat May 17 14:03:09 2003", "2003-05-17 14:03:09"},
       {kInvariant, "Sun May 17 14:03:09 2003", "refused"},      // a Saturday
       {kInvariant, "January May 18 14:03:09 2003", "refused"},  // no weekday
+      {kInvariant, "Sun May 18 14:03:09 2003", "2003-05-18 14:03:09"},
       {kInvariant, "May 17, 2003 2:30 PM", "2003-05-17 14:30:00"},
       // en_US: %x "%m/%d/%Y", %c "%a %d %b %Y %r %Z"; no zone is read.
       {kEnUs, "Sat 17 May 2003 02:03:09 PM", "2003-05-17 14:03:09"},
       {kEnUs, "Sat 17 May 2003 02:03:09 PM EDT", "refused"},
-      {kEnUs, "05/17/03", "refused"},  // writes four digits, reads no two
+      {kEnUs, "05/17/03", "refused"},  // writes four digits, reads no two or three
+      {kEnUs, "05/17/203", "refused"},
       {kEnUs, "12:30 am", "1899-12-30 00:30:00"},
       {kEnUs, "13:00 PM", "refused"},
       // de_DE: no AM/PM words; the locale's own names, folded in its own case.
@@ -122,6 +125,19 @@ TEST(ReadInLocale, Forms) {
       if (c.locale != kEvery && c.locale != locale) continue;
       EXPECT_EQ(Read(locale, c.text), c.fields) << "locale " << locale << ": " << c.text;
     }
+  }
+}
+
+// Which of a locale's patterns give a reading form: flags are passed over; a
+// date needs year, month and day, a time hours and minutes, a weekday a date.
+TEST(CompileForm, OnlyWholeDatesAndTimes) {
+  const datetimelib::platform::LocaleWords words;
+  for (const char* pattern : {"%-d.%_m.%Y", "%I:%M %p", "%a %d %b %Y"}) {
+    EXPECT_TRUE(datetimelib::CompileForm(pattern, words).has_value()) << pattern;
+  }
+  for (const char* pattern :
+       {"%m/%Y %H:%M", "%d %H", "%a %H:%M", "%a %A %d.%m.%Y", "%I:%M"}) {
+    EXPECT_FALSE(datetimelib::CompileForm(pattern, words).has_value()) << pattern;
   }
 }
 
