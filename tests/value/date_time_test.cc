@@ -150,6 +150,8 @@ TEST(Status, TransitionsAndKeptText) {
   EXPECT_EQ(value.Format(kCanonical), "1970-01-02 01:00:00");
   value.SetStatus(AdDateTime::outOfRange);
   EXPECT_EQ(value.Format(kCanonical), "");
+  EXPECT_EQ(value.SetDate(2003, 5, 17), 1);  // at midnight
+  EXPECT_EQ(value.Format(kCanonical), "2003-05-17 00:00:00");
 }
 
 TEST(Status, FromCountClockAndTm) {
