@@ -14,7 +14,6 @@ file is restored byte for byte after each mutant, also on Ctrl-C or error.
 """
 import argparse
 import json
-import os
 import random
 import re
 import shutil
