@@ -42,6 +42,7 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
       "XST-1XDT0,M10.5.0/3,M3.5.0/3",     // winter as daylight time; gaps at 03:00
       "Foo/Bar",                          // unreadable: UTC named "Foo"
       ":Foo/Bar",                         // the same after the ":"
+      "<+0545>",                          // unreadable: UTC named "+0545"
       "",                                 // empty: UTC
   };
   for (const char* zone : zones) {
