@@ -4,6 +4,8 @@
 
 #include <ctime>
 
+#include "support/value_text.h"
+
 namespace {
 
 using namespace datetimelib::platform;
@@ -40,15 +42,8 @@ TEST(Civil, SecondsCarryLikeTimegm) {
       {1999, 25, 400, 1000, -7000, 123456},
   };
   for (const auto& c : cases) {
-    std::tm fields{};
-    fields.tm_year = c[0] - 1900;
-    fields.tm_mon = c[1] - 1;
-    fields.tm_mday = c[2];
-    fields.tm_hour = c[3];
-    fields.tm_min = c[4];
-    fields.tm_sec = c[5];
     EXPECT_EQ(CivilSeconds(c[0], c[1], c[2], c[3], c[4], c[5]),
-              std::int64_t{timegm(&fields)})
+              datetimelib::testing::UtcCount(c[0], c[1], c[2], c[3], c[4], c[5]))
         << c[0] << "/" << c[1] << "/" << c[2];
   }
   EXPECT_FALSE(
