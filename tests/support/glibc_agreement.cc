@@ -94,9 +94,13 @@ AgreementReport CheckAgreementWithGlibc(const char* tz, int step_hours) {
   AgreementReport report;
   const std::int64_t step = std::int64_t{step_hours} * 3600;
   std::vector<Fold> folds;
+  std::tm previous = Libc(kFirst);
   for (std::int64_t t = kFirst; t <= kLast; t += step) {
     CheckInstant(t, &report);
-    if (t == kFirst || SameClock(Libc(t), Libc(t - step))) continue;
+    const std::tm now = Libc(t);
+    const bool same = SameClock(now, previous);
+    previous = now;
+    if (same) continue;
     // Bisect for the change's first instant, and look around it.
     std::int64_t low = t - step, high = t;
     const std::tm at_low = Libc(low);
