@@ -3,7 +3,6 @@
 #include <gtest/gtest.h>
 #include <unistd.h>
 
-#include <cstdlib>
 #include <cstring>
 #include <string>
 #include <vector>
@@ -13,22 +12,18 @@ namespace {
 using datetimelib::platform::TzWatch;
 
 // Saves the whole environment and puts it back, whatever a test did to it.
-class EnvironmentGuard {
- public:
+struct EnvironmentGuard {
+  std::vector<std::string> saved;
   EnvironmentGuard() {
-    for (char** entry = environ; entry != nullptr && *entry != nullptr; ++entry)
-      saved_.emplace_back(*entry);
+    for (char** entry = environ; *entry != nullptr; ++entry) saved.emplace_back(*entry);
   }
   ~EnvironmentGuard() {
     clearenv();
-    for (const std::string& entry : saved_) {
+    for (const std::string& entry : saved) {
       const std::size_t equals = entry.find('=');
-      setenv(entry.substr(0, equals).c_str(), entry.substr(equals + 1).c_str(), 1);
+      setenv(entry.substr(0, equals).c_str(), entry.c_str() + equals + 1, 1);
     }
   }
-
- private:
-  std::vector<std::string> saved_;
 };
 
 char tz_entry[] = "TZ=UTC0";  // given to putenv, then changed in place
