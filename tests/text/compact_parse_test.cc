@@ -82,17 +82,23 @@ TEST(ParseTolvaneDateTime, Forms) {
   }
 }
 
+struct Outcome {
+  const char* text;
+  bool valid;
+  std::int32_t count;
+  const char* kept;
+};
+
 // What the value holds after each kind of failure.
 TEST(ParseTolvaneDateTime, Outcomes) {
   TzGuard tz("America/New_York");
-  const auto expect = [](const char* text, bool valid, std::int32_t count,
-                         const char* kept) {
-    SCOPED_TRACE(text != nullptr ? text : "(null)");
+  const auto expect = [](const Outcome& c) {
+    SCOPED_TRACE(c.text != nullptr ? c.text : "(null)");
     AdDateTime value = Dirty();
-    value.ParseTolvaneDateTime(text);
-    EXPECT_EQ(value.GetStatus(), valid ? AdDateTime::valid : AdDateTime::invalid);
-    EXPECT_EQ(value.GetCTime().GetTime(), count);
-    EXPECT_EQ(KeptText(value), kept);
+    value.ParseTolvaneDateTime(c.text);
+    EXPECT_EQ(value.GetStatus(), c.valid ? AdDateTime::valid : AdDateTime::invalid);
+    EXPECT_EQ(value.GetCTime().GetTime(), c.count);
+    EXPECT_EQ(KeptText(value), c.kept);
   };
 
   // Refused while reading the text: `invalid`, the count and the kept text stay.
@@ -114,18 +120,13 @@ TEST(ParseTolvaneDateTime, Outcomes) {
   };
   for (const auto& group : refused) {
     SCOPED_TRACE(group.part);
-    for (const char* text : group.texts) expect(text, false, 777, "kept");
+    for (const char* text : group.texts) expect({text, false, 777, "kept"});
   }
 
   // Read back through ParseDateTime or ParseDateTimeGMT. When they refuse, the
   // value holds what they left; when the offset would carry the count past 32
   // bits, the instant read without it.
-  const struct {
-    const char* text;
-    bool valid;
-    std::int32_t count;
-    const char* kept;
-  } cases[] = {
+  const Outcome cases[] = {
       // The field constructor refuses the fields; the reader refuses their text.
       {"05-Jan-1969.10:00UTC", false, 777, "1969/1/5 10:0:0"},
       {"18-Jan-2038.23:00", false, 777, "2038/1/18 23:0:0"},  // past 2^31 in New York
@@ -142,7 +143,7 @@ TEST(ParseTolvaneDateTime, Outcomes) {
       // New York's 01:30 on 2003-10-26 comes twice: the first, EDT, is read.
       {"26-Oct-2003.01:30", true, 1067146200, ""},
   };
-  for (const auto& c : cases) expect(c.text, c.valid, c.count, c.kept);
+  for (const auto& c : cases) expect(c);
 }
 
 }  // namespace

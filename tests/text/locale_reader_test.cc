@@ -32,6 +32,12 @@ std::string Fields(bool read, const DateTimeFields& f) {
   return out;
 }
 
+struct Row {
+  std::uint32_t locale;
+  const char* text;
+  const char* fields;
+};
+
 std::string Read(std::uint32_t locale, const std::string& text) {
   DateTimeFields f;
   const LocaleHandle handle = LocaleHandle::ForIdentifier(locale);
@@ -77,11 +83,7 @@ TEST(ReadCanonical, AgreesWithTheLocaleReader) {
 // back).
 TEST(ReadInLocale, Forms) {
   DATETIMELIB_NEED_TEST_LOCALES();
-  const struct {
-    std::uint32_t locale;
-    const char* text;
-    const char* fields;
-  } cases[] = {
+  const Row cases[] = {
       // The ISO forms, with one-digit fields and any blanks between and after; a
       // time alone is read on 1899-12-30.
       {kEvery, "2003-05-17T14:03:09", "2003-05-17 14:03:09"},
@@ -138,11 +140,7 @@ TEST(CompileForm, OnlyWholeDatesAndTimes) {
 // locale, often opened where the last one was freed, never gets them.
 TEST(ReadInLocale, ForgetsTheLastLocaleForAnother) {
   DATETIMELIB_NEED_TEST_LOCALES();
-  const struct {
-    std::uint32_t locale;
-    const char* text;
-    const char* fields;
-  } in_turn[] = {
+  const Row in_turn[] = {
       {kDeDe, "17. März 2003", "2003-03-17 00:00:00"},
       {kFrFr, "17. März 2003", "refused"},
       {kFrFr, "17 mars 2003", "2003-03-17 00:00:00"},
