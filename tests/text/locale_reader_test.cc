@@ -79,8 +79,8 @@ TEST(ReadCanonical, AgreesWithTheLocaleReader) {
 }
 
 // What every locale reads and refuses, then each locale's own forms and names
-// beyond the date and time forms that it writes (FormatInLocale reads those
-// back).
+// beyond the date and time forms that it writes (the round_trip fuzz corpus
+// reads those back).
 TEST(ReadInLocale, Forms) {
   DATETIMELIB_NEED_TEST_LOCALES();
   const Row cases[] = {
