@@ -17,11 +17,6 @@ AdDateTime At(std::int64_t count) {
   return AdDateTime(AdTime(static_cast<std::int32_t>(count)));
 }
 
-AdDateTime WithStatus(AdDateTime value, AdDateTime::AdDateTimeStatus status) {
-  value.SetStatus(status);
-  return value;
-}
-
 // The fuzz target holds the formatters' status rule for any pattern; the
 // compact text writes the count held, whatever the status.
 TEST(Formatters, CompactTextWritesTheCountWhateverTheStatus) {
@@ -30,8 +25,6 @@ TEST(Formatters, CompactTextWritesTheCountWhateverTheStatus) {
   unreadable.ParseDateTime("not a date");         // invalid; the count is kept
   const AdDateTime refused(2040, 1, 5, 7, 3, 0);  // outOfRange, count 0
   EXPECT_EQ(unreadable.FormatTolvane(), "09-Sep-2001.01:46:40");
-  EXPECT_EQ(WithStatus(At(1000000000), AdDateTime::outOfRange).FormatTolvane(),
-            "09-Sep-2001.01:46:40");
   EXPECT_EQ(refused.FormatTolvane(), "01-Jan-1970.00:00:00");
   EXPECT_EQ(refused.Format(AdDateTime::dateOnly, AdDateTime::invariantLocale),
             "2040/1/5 7:3:0");
@@ -40,19 +33,14 @@ TEST(Formatters, CompactTextWritesTheCountWhateverTheStatus) {
   EXPECT_EQ(out, "");
 }
 
-TEST(Format, PatternsAndLimits) {
+// The format fuzz corpus compares any pattern, long texts and zone names
+// included, with strftime; here, the null pattern and the widths it does not
+// reach.
+TEST(Format, NullPatternAndWidths) {
   TzGuard tz("America/New_York");
   const AdDateTime summer = At(1053194589);  // 2003-05-17 14:03:09 EDT
-  EXPECT_EQ(summer.Format("%a %b %j %Z %z"), "Sat May 137 EDT -0400");
-  EXPECT_EQ(summer.FormatGMT("%Z %z %H"), "GMT +0000 18");
   EXPECT_EQ(summer.Format(nullptr), "");
   EXPECT_EQ(summer.FormatGMT(nullptr), "");
-  // A long pattern is written whole, not cut.
-  std::string pattern;
-  for (int i = 0; i < 2000; ++i) pattern += "%Y-%m-%d %H:%M:%S|";
-  const std::string text = summer.Format(pattern.c_str());
-  EXPECT_EQ(text.size(), 2000u * 20);
-  EXPECT_EQ(text.substr(0, 20), "2003-05-17 14:03:09|");
 
   // Field widths are applied however short the pattern, up to 1024; a wider one
   // is written as it stands rather than asking for the memory it names. An

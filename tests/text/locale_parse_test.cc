@@ -68,26 +68,3 @@ TEST(ParseDateTimeGMT, AgreesWithTheCLibrary) {
 }
 
 }  // namespace
-
-namespace {
-
-// The canonical text that Format writes reads back to the same count in zones
-// with and without daylight saving; in the hour that repeats, to its first
-// reading, which writes the same text.
-TEST(ParseDateTime, CanonicalTextRoundTrip) {
-  for (const char* zone : {"<+01>-1", "America/New_York", "Australia/Lord_Howe"}) {
-    datetimelib::testing::TzGuard tz(zone);
-    for (std::int64_t t = 86400; t <= INT32_MAX - 2 * 86400; t += 3 * 86400 + 3599) {
-      const AdDateTime written(AdTime(static_cast<std::int32_t>(t)));
-      const std::string text = written.Format("%Y-%m-%d %H:%M:%S");
-      AdDateTime read;
-      ASSERT_EQ(read.ParseDateTime(text.c_str()), 1) << zone << " " << text;
-      if (read.GetCTime().GetTime() != t) {
-        ASSERT_LT(read.GetCTime().GetTime(), t) << zone << " " << text;
-        ASSERT_EQ(read.Format("%Y-%m-%d %H:%M:%S"), text) << zone;
-      }
-    }
-  }
-}
-
-}  // namespace
