@@ -10,25 +10,24 @@ namespace datetimelib::testing {
 
 class EnvGuard {
  public:
-  // A null value unsets the variable.
-  EnvGuard(const char* name, const char* value) : name_(name) {
+  // A null value unsets the variable; `after` runs after each change.
+  EnvGuard(const char* name, const char* value, void (*after)() = nullptr)
+      : name_(name), after_(after) {
     if (const char* old = std::getenv(name)) saved_ = old;
-    Set(value);
+    Set(name, value, after);
   }
-  ~EnvGuard() { Set(saved_ ? saved_->c_str() : nullptr); }
+  ~EnvGuard() { Set(name_.c_str(), saved_ ? saved_->c_str() : nullptr, after_); }
   EnvGuard(const EnvGuard&) = delete;
   EnvGuard& operator=(const EnvGuard&) = delete;
 
- private:
-  void Set(const char* value) {
-    if (value == nullptr) {
-      unsetenv(name_.c_str());
-    } else {
-      setenv(name_.c_str(), value, 1);
-    }
+  static void Set(const char* name, const char* value, void (*after)()) {
+    value == nullptr ? unsetenv(name) : setenv(name, value, 1);
+    if (after != nullptr) after();
   }
 
+ private:
   std::string name_;
+  void (*after_)();
   std::optional<std::string> saved_;
 };
 

@@ -3,18 +3,19 @@
 #ifndef DATETIMELIB_TESTS_SUPPORT_FIXED_CLOCK_H_
 #define DATETIMELIB_TESTS_SUPPORT_FIXED_CLOCK_H_
 
+#include <atomic>
 #include <cstdint>
-#include <optional>
 
 namespace datetimelib::testing {
 
-void SetFixedNow(std::optional<std::int64_t> unix_seconds);
+inline constexpr std::int64_t kRealTime = INT64_MIN;
+inline std::atomic<std::int64_t> fixed_now{kRealTime};
 
 // Fixes "now" at an instant for the lifetime of the guard.
 class FixedNow {
  public:
-  explicit FixedNow(std::int64_t unix_seconds) { SetFixedNow(unix_seconds); }
-  ~FixedNow() { SetFixedNow(std::nullopt); }
+  explicit FixedNow(std::int64_t unix_seconds) { fixed_now.store(unix_seconds); }
+  ~FixedNow() { fixed_now.store(kRealTime); }
   FixedNow(const FixedNow&) = delete;
   FixedNow& operator=(const FixedNow&) = delete;
 };

@@ -5,11 +5,10 @@
 #include <cstring>
 #include <ctime>
 #include <filesystem>
+#include <fstream>
 #include <map>
 #include <sstream>
-#include <utility>
 
-#include "platform/civil/civil.h"
 #include "platform/zone/local_time.h"
 #include "support/tz_guard.h"
 
@@ -18,7 +17,6 @@ namespace {
 
 constexpr std::int64_t kFirst = 0;          // 1970-01-01 00:00:00 UTC
 constexpr std::int64_t kLast = 2147483647;  // 2038-01-19 03:14:07 UTC
-constexpr std::size_t kMismatchesKept = 8;
 
 std::tm Libc(std::int64_t t) {
   const time_t value = static_cast<time_t>(t);
@@ -27,120 +25,65 @@ std::tm Libc(std::int64_t t) {
   return fields;
 }
 
-std::string Describe(std::int64_t t, const std::tm& expected,
-                     const platform::BrokenDownTime& got) {
-  std::ostringstream out;
-  out << "t=" << t << " glibc " << expected.tm_year + 1900 << "-" << expected.tm_mon + 1
-      << "-" << expected.tm_mday << " " << expected.tm_hour << ":" << expected.tm_min
-      << ":" << expected.tm_sec << " off=" << expected.tm_gmtoff
-      << " dst=" << expected.tm_isdst << " " << expected.tm_zone << " | ours " << got.year
-      << "-" << got.month << "-" << got.day << " " << got.hour << ":" << got.minute << ":"
-      << got.second << " off=" << got.utc_offset << " dst=" << got.is_dst << " "
-      << got.abbreviation;
-  return out.str();
+bool SameClock(const std::tm& a, const std::tm& b) {
+  return a.tm_gmtoff == b.tm_gmtoff && a.tm_isdst == b.tm_isdst &&
+         std::strcmp(a.tm_zone, b.tm_zone) == 0;
 }
 
-std::string ReadFile(const std::string& path) {
-  std::string bytes;
-  if (std::FILE* file = std::fopen(path.c_str(), "rb")) {
-    char chunk[4096];
-    std::size_t count;
-    while ((count = std::fread(chunk, 1, sizeof chunk, file)) > 0)
-      bytes.append(chunk, count);
-    std::fclose(file);
-  }
-  return bytes;
-}
-
-void Note(AgreementReport* report, std::string what) {
-  if (report->mismatches.size() < kMismatchesKept)
-    report->mismatches.push_back(std::move(what));
+void Note(AgreementReport* report, const std::string& what) {
+  if (report->mismatches.size() < 8) report->mismatches.push_back(what);
 }
 
 void CheckInstant(std::int64_t t, AgreementReport* report) {
   ++report->instants_checked;
-  const std::tm expected = Libc(t);
-  const platform::BrokenDownTime got = platform::BreakDownLocal(t);
-  const bool same =
-      got.year == expected.tm_year + 1900 && got.month == expected.tm_mon + 1 &&
-      got.day == expected.tm_mday && got.hour == expected.tm_hour &&
-      got.minute == expected.tm_min && got.second == expected.tm_sec &&
-      got.weekday == expected.tm_wday && got.yearday == expected.tm_yday &&
-      got.utc_offset == expected.tm_gmtoff && got.is_dst == (expected.tm_isdst > 0) &&
-      std::strcmp(got.abbreviation, expected.tm_zone) == 0;
-  if (!same) Note(report, "breakdown " + Describe(t, expected, got));
+  const std::tm e = Libc(t);
+  const platform::BrokenDownTime g = platform::BreakDownLocal(t);
+  if (g.year == e.tm_year + 1900 && g.month == e.tm_mon + 1 && g.day == e.tm_mday &&
+      g.hour == e.tm_hour && g.minute == e.tm_min && g.second == e.tm_sec &&
+      g.weekday == e.tm_wday && g.yearday == e.tm_yday && g.utc_offset == e.tm_gmtoff &&
+      g.is_dst == (e.tm_isdst > 0) && std::strcmp(g.abbreviation, e.tm_zone) == 0)
+    return;
+  char text[256];
+  std::snprintf(text, sizeof text,
+                "breakdown t=%lld glibc %d-%d-%d %d:%d:%d off=%ld dst=%d %s | ours "
+                "%d-%d-%d %d:%d:%d off=%d dst=%d %s",
+                static_cast<long long>(t), e.tm_year + 1900, e.tm_mon + 1, e.tm_mday,
+                e.tm_hour, e.tm_min, e.tm_sec, e.tm_gmtoff, e.tm_isdst, e.tm_zone, g.year,
+                g.month, g.day, g.hour, g.minute, g.second, g.utc_offset, g.is_dst,
+                g.abbreviation);
+  Note(report, text);
 }
 
-// The first instant in (low, high] whose offset or isdst differs from low's.
-std::int64_t Bisect(std::int64_t low, std::int64_t high) {
-  const std::tm at_low = Libc(low);
-  while (high - low > 1) {
-    const std::int64_t middle = low + (high - low) / 2;
-    const std::tm at_middle = Libc(middle);
-    if (at_middle.tm_gmtoff == at_low.tm_gmtoff &&
-        at_middle.tm_isdst == at_low.tm_isdst &&
-        std::strcmp(at_middle.tm_zone, at_low.tm_zone) == 0) {
-      low = middle;
-    } else {
-      high = middle;
-    }
-  }
-  return high;
-}
-
-// A change of glibc's clocks, found by bisection.
-struct Change {
-  std::int64_t at;             // first instant of the new time
-  std::int64_t offset_before;  // seconds east
-  std::int64_t offset_after;
+// Local seconds (counted as if UTC) that a change setting the clocks back makes
+// occur twice: [start, end), the earlier reading being `civil - offset`.
+struct Fold {
+  std::int64_t start, end, offset;
 };
 
-std::tm MktimeFields(std::int64_t civil) {
-  const std::int64_t days = platform::FloorDiv(civil, 86400);
-  const std::int64_t second_of_day = civil - days * 86400;
-  const platform::CivilDay date = platform::CivilFromDays(days);
-  std::tm fields{};
-  fields.tm_year = static_cast<int>(date.year) - 1900;
-  fields.tm_mon = date.month - 1;
-  fields.tm_mday = date.day;
-  fields.tm_hour = static_cast<int>(second_of_day / 3600);
-  fields.tm_min = static_cast<int>(second_of_day / 60 % 60);
-  fields.tm_sec = static_cast<int>(second_of_day % 60);
-  fields.tm_isdst = -1;
-  return fields;
-}
-
-// `civil` occurs twice when a change sets the clocks back over it; then the
-// earlier reading is the one before the change.
-void CheckLocalHour(std::int64_t civil, const std::vector<Change>& changes,
-                    std::size_t* next_change, AgreementReport* report) {
-  while (*next_change < changes.size() &&
-         changes[*next_change].at + std::max(changes[*next_change].offset_before,
-                                             changes[*next_change].offset_after) <=
-             civil) {
-    ++*next_change;
-  }
+// A local time that occurs twice must give its earlier instant, which mktime
+// does not promise; any other must give mktime's answer.
+void CheckLocalHour(std::int64_t civil, const std::vector<Fold>& folds, std::size_t* next,
+                    AgreementReport* report) {
+  while (*next < folds.size() && folds[*next].end <= civil) ++*next;
   const std::int64_t ours = platform::ComposeLocal(civil);
-  for (std::size_t i = *next_change; i < changes.size() && i < *next_change + 2; ++i) {
-    const Change& change = changes[i];
-    if (change.offset_before > change.offset_after &&
-        change.at + change.offset_after <= civil &&
-        civil < change.at + change.offset_before) {
-      ++report->repeated_hours;
-      if (ours != civil - change.offset_before) {
-        Note(report, "repeated local time " + std::to_string(civil) + ": ours " +
-                         std::to_string(ours) + ", earlier reading " +
-                         std::to_string(civil - change.offset_before));
-      }
-      return;
-    }
+  std::int64_t expected = INT64_MIN;
+  for (std::size_t i = *next; i < folds.size() && i < *next + 2; ++i) {
+    if (folds[i].start <= civil && civil < folds[i].end)
+      expected = civil - folds[i].offset;
   }
-  ++report->local_hours_checked;
-  std::tm fields = MktimeFields(civil);
-  const std::int64_t expected = mktime(&fields);
+  if (expected != INT64_MIN) {
+    ++report->repeated_hours;
+  } else {
+    ++report->local_hours_checked;
+    const time_t as_utc = static_cast<time_t>(civil);
+    std::tm fields{};
+    gmtime_r(&as_utc, &fields);
+    fields.tm_isdst = -1;
+    expected = mktime(&fields);
+  }
   if (ours != expected) {
     Note(report, "local time " + std::to_string(civil) + ": ours " +
-                     std::to_string(ours) + ", mktime " + std::to_string(expected));
+                     std::to_string(ours) + ", expected " + std::to_string(expected));
   }
 }
 
@@ -150,49 +93,51 @@ AgreementReport CheckAgreementWithGlibc(const char* tz, int step_hours) {
   TzGuard guard(tz);
   AgreementReport report;
   const std::int64_t step = std::int64_t{step_hours} * 3600;
-  std::vector<Change> changes;
+  std::vector<Fold> folds;
   std::tm previous = Libc(kFirst);
   for (std::int64_t t = kFirst; t <= kLast; t += step) {
     CheckInstant(t, &report);
     const std::tm now = Libc(t);
-    if (t > kFirst &&
-        (now.tm_gmtoff != previous.tm_gmtoff || now.tm_isdst != previous.tm_isdst ||
-         std::strcmp(now.tm_zone, previous.tm_zone) != 0)) {
-      const std::int64_t at = Bisect(t - step, t);
-      ++report.transitions_found;
-      for (const std::int64_t near : {at - 1, at, at + 1}) CheckInstant(near, &report);
-      changes.push_back({at, Libc(at - 1).tm_gmtoff, Libc(at).tm_gmtoff});
-    }
+    const bool same = SameClock(now, previous);
     previous = now;
+    if (same) continue;
+    // Bisect for the change's first instant, and look around it.
+    std::int64_t low = t - step, high = t;
+    const std::tm at_low = Libc(low);
+    while (high - low > 1) {
+      const std::int64_t middle = low + (high - low) / 2;
+      (SameClock(Libc(middle), at_low) ? low : high) = middle;
+    }
+    ++report.transitions_found;
+    for (const std::int64_t near : {high - 1, high, high + 1})
+      CheckInstant(near, &report);
+    const std::int64_t before = Libc(high - 1).tm_gmtoff, after = Libc(high).tm_gmtoff;
+    if (before > after) folds.push_back({high + after, high + before, before});
   }
   // Local hours from 1970-01-02 to 2038-01-17, clear of the ends of the 32-bit range.
-  std::size_t next_change = 0;
-  for (std::int64_t civil = 86400; civil <= kLast - 2 * 86400; civil += step) {
-    CheckLocalHour(civil, changes, &next_change, &report);
-  }
+  std::size_t next = 0;
+  for (std::int64_t civil = 86400; civil <= kLast - 2 * 86400; civil += step)
+    CheckLocalHour(civil, folds, &next, &report);
   return report;
 }
 
 std::vector<std::string> SystemZoneNames() {
   namespace fs = std::filesystem;
   const fs::path root = "/usr/share/zoneinfo";
-  std::map<std::pair<std::uintmax_t, std::string>, std::string> by_content;
+  std::map<std::string, std::string> by_content;  // the first name of each file
   std::error_code error;
   for (auto it = fs::recursive_directory_iterator(root, error);
        it != fs::recursive_directory_iterator(); it.increment(error)) {
     if (error) break;
-    const fs::path relative = fs::relative(it->path(), root, error);
-    const std::string name = relative.generic_string();
-    if (it->is_directory() && (name == "posix" || name == "right")) {
+    const std::string name = fs::relative(it->path(), root, error).generic_string();
+    if (it->is_directory() && (name == "posix" || name == "right"))
       it.disable_recursion_pending();
-      continue;
-    }
     if (!it->is_regular_file() || name == "posixrules" || name == "localtime") continue;
-    const std::string bytes = ReadFile(it->path().string());
-    if (bytes.compare(0, 4, "TZif") != 0) continue;
-    const auto key = std::make_pair(static_cast<std::uintmax_t>(bytes.size()), bytes);
-    auto found = by_content.find(key);
-    if (found == by_content.end() || name < found->second) by_content[key] = name;
+    std::ostringstream bytes;
+    bytes << std::ifstream(it->path(), std::ios::binary).rdbuf();
+    if (bytes.str().compare(0, 4, "TZif") != 0) continue;
+    auto [found, added] = by_content.emplace(bytes.str(), name);
+    if (!added && name < found->second) found->second = name;
   }
   std::vector<std::string> names;
   for (const auto& entry : by_content) names.push_back(entry.second);

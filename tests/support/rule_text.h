@@ -11,20 +11,13 @@ namespace datetimelib::testing {
 // "M3.2.0@7200", "J60@0", "59@-3600": the date form and the time in seconds.
 inline std::string RuleText(const platform::TransitionRule& rule) {
   using Form = platform::TransitionRule::Form;
-  std::string text;
-  switch (rule.form) {
-    case Form::kMonthWeekDay:
-      text = "M" + std::to_string(rule.month) + "." + std::to_string(rule.week) + "." +
-             std::to_string(rule.weekday);
-      break;
-    case Form::kJulian:
-      text = "J" + std::to_string(rule.day);
-      break;
-    case Form::kZeroBased:
-      text = std::to_string(rule.day);
-      break;
-  }
-  return text + "@" + std::to_string(rule.time_seconds);
+  const std::string day = std::to_string(rule.day);
+  return (rule.form == Form::kMonthWeekDay
+              ? "M" + std::to_string(rule.month) + "." + std::to_string(rule.week) + "." +
+                    std::to_string(rule.weekday)
+          : rule.form == Form::kJulian ? "J" + day
+                                       : day) +
+         "@" + std::to_string(rule.time_seconds);
 }
 
 // "EST -18000", "EST -18000 EDT -14400 no-rules",

@@ -5,9 +5,8 @@
 
 #include <stdlib.h>
 
-#include <cstdio>
-#include <cstdlib>
 #include <filesystem>
+#include <fstream>
 #include <string>
 
 namespace datetimelib::testing {
@@ -15,8 +14,7 @@ namespace datetimelib::testing {
 class TempDir {
  public:
   TempDir() {
-    const char* base = std::getenv("TMPDIR");
-    std::string pattern = std::string(base && *base ? base : "/tmp") + "/dtl-XXXXXX";
+    std::string pattern = std::filesystem::temp_directory_path() / "dtl-XXXXXX";
     if (mkdtemp(pattern.data()) != nullptr) path_ = pattern;
   }
   ~TempDir() {
@@ -34,10 +32,7 @@ class TempDir {
   std::string Write(const std::string& name, const std::string& content) const {
     const std::string file = Path(name);
     std::filesystem::create_directories(std::filesystem::path(file).parent_path());
-    if (std::FILE* out = std::fopen(file.c_str(), "wb")) {
-      std::fwrite(content.data(), 1, content.size(), out);
-      std::fclose(out);
-    }
+    std::ofstream(file, std::ios::binary) << content;
     return file;
   }
 

@@ -7,12 +7,6 @@
 #include <gtest/gtest.h>
 #include <locale.h>
 
-#include <cstdlib>
-#include <optional>
-#include <string>
-
-#include "support/env_guard.h"
-
 namespace datetimelib::testing {
 
 // Whether the compiled test locales can be opened.

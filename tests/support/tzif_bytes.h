@@ -28,58 +28,36 @@ struct TzifParts {
   std::optional<std::uint32_t> time_count_override;
 };
 
-namespace tzif_detail {
-
-inline void PutBigEndian(std::string* out, std::uint64_t value, int bytes) {
-  for (int i = bytes - 1; i >= 0; --i) {
-    out->push_back(static_cast<char>((value >> (8 * i)) & 0xff));
-  }
-}
-
-inline void PutHeaderAndBlock(std::string* out, const TzifParts& parts, char version,
-                              int time_bytes, bool override_count) {
-  const auto count = [](std::size_t n) { return static_cast<std::uint32_t>(n); };
-  const std::uint32_t indicator_count = parts.indicators ? count(parts.types.size()) : 0;
-  out->append("TZif");
-  out->push_back(version);
-  out->append(15, '\0');
-  PutBigEndian(out, indicator_count, 4);
-  PutBigEndian(out, indicator_count, 4);
-  PutBigEndian(out, parts.leap_count, 4);
-  PutBigEndian(out,
-               override_count && parts.time_count_override ? *parts.time_count_override
-                                                           : count(parts.times.size()),
-               4);
-  PutBigEndian(out, count(parts.types.size()), 4);
-  PutBigEndian(out, count(parts.designations.size()), 4);
-  for (const std::int64_t time : parts.times) {
-    PutBigEndian(out, static_cast<std::uint64_t>(time), time_bytes);
-  }
-  for (const std::uint8_t index : parts.type_indices)
-    out->push_back(static_cast<char>(index));
-  for (const auto& type : parts.types) {
-    PutBigEndian(out, static_cast<std::uint32_t>(type.utc_offset), 4);
-    out->push_back(static_cast<char>(type.is_dst));
-    out->push_back(static_cast<char>(type.designation));
-  }
-  out->append(parts.designations);
-  out->append(std::size_t{parts.leap_count} * static_cast<std::size_t>(time_bytes + 4),
-              '\0');
-  out->append(std::size_t{indicator_count} * 2, '\0');
-}
-
-}  // namespace tzif_detail
-
 // Version 1: one block with 32-bit times. Later versions: the same block, then a
 // second header and block with 64-bit times, then the footer.
-inline std::string TzifBytes(const TzifParts& parts) {
+inline std::string TzifBytes(const TzifParts& p) {
   std::string out;
-  const bool version1 = parts.version == '\0';
-  tzif_detail::PutHeaderAndBlock(&out, parts, parts.version, 4, version1);
-  if (version1) return out;
-  tzif_detail::PutHeaderAndBlock(&out, parts, parts.version, 8, true);
-  out.append(parts.footer);
-  return out;
+  const auto put = [&out](std::uint64_t value, std::size_t bytes) {
+    while (bytes-- > 0) out.push_back(static_cast<char>((value >> (8 * bytes)) & 0xff));
+  };
+  const auto block = [&](std::size_t time_bytes, bool data_read) {
+    const std::size_t types = p.types.size(), indicators = p.indicators ? types : 0;
+    out.append("TZif").append(1, p.version).append(15, '\0');
+    for (const std::uint64_t count :
+         {indicators, indicators, std::size_t{p.leap_count},
+          data_read && p.time_count_override ? *p.time_count_override : p.times.size(),
+          types, p.designations.size()})
+      put(count, 4);
+    for (const std::int64_t time : p.times)
+      put(static_cast<std::uint64_t>(time), time_bytes);
+    for (const std::uint8_t index : p.type_indices) put(index, 1);
+    for (const auto& type : p.types) {
+      put(static_cast<std::uint32_t>(type.utc_offset), 4);
+      put(type.is_dst, 1);
+      put(type.designation, 1);
+    }
+    out.append(p.designations)
+        .append(p.leap_count * (time_bytes + 4) + indicators * 2, '\0');
+  };
+  block(4, p.version == '\0');
+  if (p.version == '\0') return out;
+  block(8, true);
+  return out.append(p.footer);
 }
 
 }  // namespace datetimelib::testing

@@ -35,9 +35,8 @@ inline std::int64_t UtcCount(int year, int month, int day, int hour = 0, int min
 
 // A valid value with the count 777 and the kept text "kept", to show what a
 // call replaces and what it leaves.
-inline constexpr std::int32_t kDirtyCount = 777;
 inline AdDateTime Dirty() {
-  AdDateTime value{AdTime(kDirtyCount)};
+  AdDateTime value{AdTime(777)};
   value.ParseDateTime("kept");
   value.SetStatus(AdDateTime::valid);
   return value;

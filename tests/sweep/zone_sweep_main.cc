@@ -7,25 +7,22 @@
 // and mktime take one process-wide lock, so threads would not).
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
 #include <string>
 #include <vector>
 
 #include "support/glibc_agreement.h"
 
 int main(int argc, char** argv) {
-  int shard = 0;
-  int shards = 1;
-  int step_hours = 1;
+  int shard = 0, shards = 1, step_hours = 1;
   std::vector<std::string> zones;
   for (int i = 1; i < argc; ++i) {
     const std::string argument = argv[i];
-    if (argument == "--shard" && i + 1 < argc) {
-      shard = std::atoi(argv[++i]);
-    } else if (argument == "--shards" && i + 1 < argc) {
-      shards = std::atoi(argv[++i]);
-    } else if (argument == "--step-hours" && i + 1 < argc) {
-      step_hours = std::atoi(argv[++i]);
+    int* option = argument == "--shard"        ? &shard
+                  : argument == "--shards"     ? &shards
+                  : argument == "--step-hours" ? &step_hours
+                                               : nullptr;
+    if (option != nullptr && i + 1 < argc) {
+      *option = std::atoi(argv[++i]);
     } else {
       zones.push_back(argument);
     }
@@ -36,33 +33,29 @@ int main(int argc, char** argv) {
     return 2;
   }
   if (zones.empty()) zones = datetimelib::testing::SystemZoneNames();
-
-  long long instants = 0;
-  long long transitions = 0;
-  long long hours = 0;
-  long long repeated = 0;
-  int checked = 0;
-  int failed = 0;
-  for (std::size_t i = static_cast<std::size_t>(shard); i < zones.size();
-       i += static_cast<std::size_t>(shards)) {
+  datetimelib::testing::AgreementReport total;
+  int checked = 0, failed = 0;
+  for (auto i = static_cast<std::size_t>(shard); i < zones.size();
+       i += static_cast<std::size_t>(shards), ++checked) {
     const auto report =
         datetimelib::testing::CheckAgreementWithGlibc(zones[i].c_str(), step_hours);
-    ++checked;
-    instants += report.instants_checked;
-    transitions += report.transitions_found;
-    hours += report.local_hours_checked;
-    repeated += report.repeated_hours;
-    if (!report.mismatches.empty()) {
-      ++failed;
-      std::printf("MISMATCH %s\n", zones[i].c_str());
-      for (const auto& line : report.mismatches) std::printf("  %s\n", line.c_str());
-    }
+    total.instants_checked += report.instants_checked;
+    total.transitions_found += report.transitions_found;
+    total.local_hours_checked += report.local_hours_checked;
+    total.repeated_hours += report.repeated_hours;
+    if (report.mismatches.empty()) continue;
+    ++failed;
+    std::printf("MISMATCH %s\n", zones[i].c_str());
+    for (const auto& line : report.mismatches) std::printf("  %s\n", line.c_str());
   }
   std::printf(
       "zones %d (of %zu, shard %d/%d), disagreeing %d; breakdowns %lld, transitions "
       "%lld, "
       "compositions %lld, repeated local times %lld\n",
-      checked, zones.size(), shard, shards, failed, instants, transitions, hours,
-      repeated);
+      checked, zones.size(), shard, shards, failed,
+      static_cast<long long>(total.instants_checked),
+      static_cast<long long>(total.transitions_found),
+      static_cast<long long>(total.local_hours_checked),
+      static_cast<long long>(total.repeated_hours));
   return failed == 0 ? 0 : 1;
 }

@@ -25,23 +25,21 @@ TEST(ParseDateTime, Outcomes) {
     AdDateTime::AdDateTimeStatus status;  // ParseDateTime(GMT) gives 1 for valid
     std::int32_t count;
   } cases[] = {
+      // The fuzz target holds these rules for any text; here, the ends of the range
+      // and the texts it does not make. "." as the 20th byte: the second read
+      // drops the fraction.
       {"2038-01-18 23:59:59", kGmt, kValid, 2147471999},
-      // "." as the 20th byte: the second read drops the fraction.
       {"2003-05-17 14:03:09.250", kGmt, kValid, 1053180189},
       {"2003-05-17 14:03:9.5", kGmt, kInvalid, 777},
       // Out of range, a time of day alone too: the count stays.
       {"2038-01-19 00:00:00", kGmt, kOutOfRange, 777},
-      {"1969-12-31 23:59:59", kGmt, kOutOfRange, 777},
       {"14:30:00", kGmt, kOutOfRange, 777},
       {nullptr, kGmt, kInvalid, 777},  // read as the empty text
-      // Local time: 1899-12-30, the date of a time of day read alone, is 1970-01-01.
-      {"1899-12-30 18:00:00", kLocal, kValid, 23 * 3600},
+      // Local time: 1899-12-30, the date of a time of day read alone, is 1970-01-01;
+      // out of range, the count is 0.
       {"14:30", kLocal, kValid, 19 * 3600 + 30 * 60},
-      // Out of range: the count is 0.
       {"1899-12-31 18:00:00", kLocal, kOutOfRange, 0},
-      {"1969-12-31 23:59:59", kLocal, kOutOfRange, 0},
       {"2038-01-18 23:00:00", kLocal, kOutOfRange, 0},  // past 2^31 s in New York
-      {nullptr, kLocal, kInvalid, 777},
   };
   for (const auto& c : cases) {
     SCOPED_TRACE(testing::Message() << (c.text ? c.text : "(null)") << " gmt " << c.gmt);
@@ -66,29 +64,6 @@ TEST(ParseDateTimeGMT, AgreesWithTheCLibrary) {
     AdDateTime read;
     ASSERT_EQ(read.ParseDateTimeGMT(text), 1) << text;
     ASSERT_EQ(read.GetCTime().GetTime(), t) << text;
-  }
-}
-
-}  // namespace
-
-namespace {
-
-// The canonical text that Format writes reads back to the same count in zones
-// with and without daylight saving; in the hour that repeats, to its first
-// reading, which writes the same text.
-TEST(ParseDateTime, CanonicalTextRoundTrip) {
-  for (const char* zone : {"<+01>-1", "America/New_York", "Australia/Lord_Howe"}) {
-    datetimelib::testing::TzGuard tz(zone);
-    for (std::int64_t t = 86400; t <= INT32_MAX - 2 * 86400; t += 3 * 86400 + 3599) {
-      const AdDateTime written(AdTime(static_cast<std::int32_t>(t)));
-      const std::string text = written.Format("%Y-%m-%d %H:%M:%S");
-      AdDateTime read;
-      ASSERT_EQ(read.ParseDateTime(text.c_str()), 1) << zone << " " << text;
-      if (read.GetCTime().GetTime() != t) {
-        ASSERT_LT(read.GetCTime().GetTime(), t) << zone << " " << text;
-        ASSERT_EQ(read.Format("%Y-%m-%d %H:%M:%S"), text) << zone;
-      }
-    }
   }
 }
 

@@ -35,11 +35,7 @@ std::tm Local(std::int64_t unix_seconds) {
   return fields;
 }
 
-std::string Canonical(const std::tm& fields) {
-  char text[64];
-  return std::string(text,
-                     std::strftime(text, sizeof text, "%Y-%m-%d %H:%M:%S", &fields));
-}
+bool Dst(std::int64_t unix_seconds) { return Local(unix_seconds).tm_isdst > 0; }
 
 // The last year of 2008-2037 that does not agree in the process's zone, 2007
 // when all do.
@@ -48,22 +44,22 @@ int LastDifferingYear() {
   const std::int64_t from = 1199145600 - 4 * 86400;  // 2008-01-01 UTC, less 4 days
   std::map<int, int> agreeing_changes;               // by year
   int last = 2007;
-  bool dst = Local(from).tm_isdst > 0;
+  bool dst = Dst(from);
   for (std::int64_t t = from + kStep; t <= INT32_MAX; t += kStep) {
-    if ((Local(t).tm_isdst > 0) == dst) continue;
+    if (Dst(t) == dst) continue;
     std::int64_t low = t - kStep, high = t;  // flips in (low, high]
     while (high - low > 1) {
       const std::int64_t middle = low + (high - low) / 2;
-      ((Local(middle).tm_isdst > 0) == dst ? low : high) = middle;
+      (Dst(middle) == dst ? low : high) = middle;
     }
-    const std::tm before = Local(low);
-    std::tm change = before;
-    change.tm_sec += 1;
-    timegm(&change);  // normalises the fields, as if UTC
-    const int year = before.tm_year + 1900;
+    std::tm fields = Local(low);
+    const int year = fields.tm_year + 1900;
+    fields.tm_sec += dst ? 1 : 0;  // the end is the change itself
+    timegm(&fields);               // normalises the fields, as if UTC
+    char libc[32];
+    std::strftime(libc, sizeof libc, "%Y-%m-%d %H:%M:%S", &fields);
     std::string start, end;
     AdDateTime::GenerateDSTDates(year, start, end);
-    const std::string libc = Canonical(dst ? change : before);
     if (libc == (dst ? end : start)) {
       ++agreeing_changes[year];
     } else {

@@ -40,7 +40,6 @@ TEST(FieldConstructor, AcceptsAndCarriesFields) {
       {{2000, 13, 1, 0, 0, 0}, "2001-01-01 00:00:00"},
       {{2000, 3, 0, 0, 0, 0}, "2000-02-29 00:00:00"},
       {{2003, 1, 1, 25, 0, 0}, "2003-01-02 01:00:00"},
-      {{2003, 1, 1, 0, -1, 0}, "2002-12-31 23:59:00"},
       // A time of day on 1899-12-30 lands on 1970-01-01.
       {{1899, 12, 30, 10, 30, 0}, "1970-01-01 10:30:00"},
   };
@@ -64,14 +63,11 @@ TEST(FieldConstructor, RefusesWithKeptText) {
     const char* kept;
   } cases[] = {
       {{2038, 1, 19, 0, 0, 0}, "2038/1/19 0:0:0"},
-      {{2040, 1, 5, 7, 3, 0}, "2040/1/5 7:3:0"},
       {{1969, 12, 31, 23, 59, 59}, "1969/12/31 23:59:59"},
-      {{1899, 12, 31, 10, 30, 0}, "1899/12/31 10:30:0"},
       {{1969, -1, -2, -3, -4, -5}, "1969/-1/-2 -3:-4:-5"},
       {{LONG_MIN, 0, 0, 0, 0, 0}, "-9223372036854775808/0/0 0:0:0"},
       // They pass the range test, but their local time has no 32-bit count.
       {{2038, 1, 18, 1000000, 0, 0}, "2038/1/18 1000000:0:0"},
-      {{2000, LONG_MAX, 1, 0, 0, 0}, "2000/9223372036854775807/1 0:0:0"},
       {{1899, 12, 30, -1000000, 0, 0}, "1899/12/30 -1000000:0:0"},
   };
   for (const auto& c : cases) {
@@ -154,6 +150,8 @@ TEST(Status, TransitionsAndKeptText) {
   EXPECT_EQ(value.Format(kCanonical), "1970-01-02 01:00:00");
   value.SetStatus(AdDateTime::outOfRange);
   EXPECT_EQ(value.Format(kCanonical), "");
+  EXPECT_EQ(value.SetDate(2003, 5, 17), 1);  // at midnight
+  EXPECT_EQ(value.Format(kCanonical), "2003-05-17 00:00:00");
 }
 
 TEST(Status, FromCountClockAndTm) {

@@ -43,14 +43,12 @@ TEST(AdDuration, Construction) {
     std::int32_t seconds;
   } cases[] = {
       {"0.5 day", AdDuration(0.5), 43200},
-      {"-0.25 day", AdDuration(-0.25), -21600},
       {"truncated toward zero", AdDuration(-0.00001), 0},
       {"an int is days", AdDuration(1), 86400},
       {"saturated above", AdDuration(1e12), INT32_MAX},
       {"saturated below", AdDuration(-1e12), INT32_MIN},
       {"NaN", AdDuration(std::nan("")), 0},
       {"parts", AdDuration(1, -1, 1, -1), 82859},
-      {"-365 days", AdDuration(-365, 0, 0, 0), -31536000},
       // 24856 days are past 32 bits: the total wraps modulo 2^32.
       {"wraps", AdDuration(24856, 0, 0, 0),
        static_cast<std::int32_t>(24856LL * 86400 - 4294967296LL)},

@@ -4,25 +4,31 @@
 
 #include <ctime>
 
+#include "support/value_text.h"
+
 namespace {
 
 using namespace datetimelib::platform;
 
-// The 32-bit forms agree with the general algorithms over their whole range,
-// at both ends of each day tested.
-TEST(Civil, FastFieldsAgreeWithGeneral) {
-  for (std::int64_t days = -kFastCivilLimit + 1; days < kFastCivilLimit - 1; days += 5) {
-    for (const std::int64_t second_of_day : {std::int64_t{0}, std::int64_t{86399}}) {
-      const CivilFields fast = FastCivilFields(days * 86400 + second_of_day);
-      const CivilDay general = CivilFromDays(days);
-      ASSERT_EQ(fast.date.year, general.year) << days;
-      ASSERT_EQ(fast.date.month * 100 + fast.date.day, general.month * 100 + general.day)
-          << days;
-      ASSERT_EQ(fast.yearday, YearDay(general.year, general.month, general.day)) << days;
-      ASSERT_EQ(fast.weekday, WeekdayFromDays(days)) << days;
-      ASSERT_EQ(fast.hour * 3600 + fast.minute * 60 + fast.second, second_of_day) << days;
-    }
+bool SameAsGmtime(std::int64_t t, const CivilFields& got) {
+  const time_t value = static_cast<time_t>(t);
+  std::tm e{};
+  gmtime_r(&value, &e);
+  return got.date.year == e.tm_year + 1900 && got.date.month == e.tm_mon + 1 &&
+         got.date.day == e.tm_mday && got.hour == e.tm_hour && got.minute == e.tm_min &&
+         got.second == e.tm_sec && got.weekday == e.tm_wday && got.yearday == e.tm_yday;
+}
+
+// The 32-bit forms over their whole range and the general algorithms beyond it
+// (a few centuries each side, and 2^40), at both ends of each day tested.
+TEST(Civil, FieldsAgreeWithGmtime) {
+  constexpr std::int64_t kBeyond = 200000;
+  for (std::int64_t days = -kFastCivilLimit - kBeyond; days < kFastCivilLimit + kBeyond;
+       days += 5) {
+    for (const std::int64_t t : {days * 86400, days * 86400 + 86399})
+      ASSERT_TRUE(SameAsGmtime(t, CivilFieldsOf(t))) << t;
   }
+  EXPECT_TRUE(SameAsGmtime(std::int64_t{1} << 40, CivilFieldsOf(std::int64_t{1} << 40)));
 }
 
 // Fields carry as timegm carries them; fields too large for any count are
@@ -36,21 +42,26 @@ TEST(Civil, SecondsCarryLikeTimegm) {
       {1999, 25, 400, 1000, -7000, 123456},
   };
   for (const auto& c : cases) {
-    std::tm fields{};
-    fields.tm_year = c[0] - 1900;
-    fields.tm_mon = c[1] - 1;
-    fields.tm_mday = c[2];
-    fields.tm_hour = c[3];
-    fields.tm_min = c[4];
-    fields.tm_sec = c[5];
     EXPECT_EQ(CivilSeconds(c[0], c[1], c[2], c[3], c[4], c[5]),
-              std::int64_t{timegm(&fields)})
+              datetimelib::testing::UtcCount(c[0], c[1], c[2], c[3], c[4], c[5]))
         << c[0] << "/" << c[1] << "/" << c[2];
   }
   EXPECT_FALSE(
       CivilSeconds(INT64_MAX, INT64_MAX, INT64_MAX, INT64_MAX, INT64_MAX, INT64_MAX));
-  // Huge fields that cancel are still exact (the 128-bit path).
-  EXPECT_EQ(CivilSeconds(1970, 1, 1, 1000000000000LL, -60000000000000LL, 0), 0);
+  // Fields beyond 32 bits that cancel take the 128-bit path: the same counts, and
+  // the same limit of 2^40 seconds either way.
+  constexpr std::int64_t kWide = std::int64_t{1} << 40;
+  for (std::int64_t year = 1599; year <= 2401; ++year) {
+    for (const int month : {-1, 0, 1, 2, 3, 12, 14}) {
+      ASSERT_EQ(CivilSeconds(year, month, 1, kWide, -60 * kWide, 0),
+                CivilSeconds(year, month, 1, 0, 0, 0))
+          << year << "/" << month;
+    }
+  }
+  for (const std::int64_t t : {kWide - 1, 1 - kWide})
+    EXPECT_EQ(CivilSeconds(1970, 1, 1, 0, 0, t), t);
+  EXPECT_FALSE(CivilSeconds(1970, 1, 1, 0, 0, kWide));
+  EXPECT_FALSE(CivilSeconds(1970, 1, 1, 0, 0, -kWide));
 }
 
 }  // namespace

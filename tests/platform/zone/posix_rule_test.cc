@@ -18,10 +18,10 @@ TEST(ParsePosixRule, AcceptsEachPartOnlyWithinItsLimits) {
     std::vector<const char*> accepted, refused;
   } cases[] = {
       {"names: three characters at least, quotes closed, nothing else inside",
-       {"XST3", "<A-1>1", "EST5EDT"},
+       {"XST3", "<A-1>1", "EST5EDT", "xyz3"},
        {"", "XS5", "<XS>5", "<XST5", "<X_T>5", "EST5ED"}},
       {"offsets: required for standard time, at most 24:00:00, fields in range",
-       {"XST-24", "<-0325>+3:25:45", "EST5EDT2:30:15", "EST5EDT-24"},
+       {"XST-24", "<-0325>+3:25:45", "EST5EDT2:30:15", "EST9EDT-24"},
        {"EST", "EST+", "EST24:00:01", "EST5:60", "EST5:00:60", "EST5:", "EST5EDT24:00:01",
         "EST99999999999999999999"}},
       {"dates: within their ranges, complete",

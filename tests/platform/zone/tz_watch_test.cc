@@ -3,7 +3,6 @@
 #include <gtest/gtest.h>
 #include <unistd.h>
 
-#include <cstdlib>
 #include <cstring>
 #include <string>
 #include <vector>
@@ -13,22 +12,18 @@ namespace {
 using datetimelib::platform::TzWatch;
 
 // Saves the whole environment and puts it back, whatever a test did to it.
-class EnvironmentGuard {
- public:
+struct EnvironmentGuard {
+  std::vector<std::string> saved;
   EnvironmentGuard() {
-    for (char** entry = environ; entry != nullptr && *entry != nullptr; ++entry)
-      saved_.emplace_back(*entry);
+    for (char** entry = environ; *entry != nullptr; ++entry) saved.emplace_back(*entry);
   }
   ~EnvironmentGuard() {
     clearenv();
-    for (const std::string& entry : saved_) {
+    for (const std::string& entry : saved) {
       const std::size_t equals = entry.find('=');
-      setenv(entry.substr(0, equals).c_str(), entry.substr(equals + 1).c_str(), 1);
+      setenv(entry.substr(0, equals).c_str(), entry.c_str() + equals + 1, 1);
     }
   }
-
- private:
-  std::vector<std::string> saved_;
 };
 
 char tz_entry[] = "TZ=UTC0";  // given to putenv, then changed in place
@@ -52,13 +47,15 @@ TEST(TzWatch, NoticesEveryWayTzChanges) {
       {[] { putenv(tz_entry); }, "UTC0"},
       // putenv's string changed in place.
       {[] { std::memcpy(tz_entry, "TZ=EST5", 7); }, "EST5"},
+      // unsetenv: nothing left of the value read before.
+      {[] { unsetenv("TZ"); }, "(unset)"},
   };
   for (const auto& step : steps) {
     ASSERT_TRUE(watch.Unchanged());
     step.change();
     EXPECT_FALSE(watch.Unchanged()) << step.tz;
     watch.Refresh();
-    EXPECT_EQ(watch.value(), step.tz);
+    EXPECT_EQ(watch.value().value_or("(unset)"), step.tz);
   }
 }
 

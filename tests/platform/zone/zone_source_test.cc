@@ -4,6 +4,7 @@
 #include <sys/stat.h>
 
 #include <string>
+#include <utility>
 
 #include "support/rule_text.h"
 #include "support/temp_dir.h"
@@ -35,12 +36,13 @@ TEST(LoadZone, DecidesAsTheCLibraryDoes) {
   constexpr char kFileRule[] = "FST -10800 FDT -7200 M4.1.0@7200 M10.5.0@10800";
   datetimelib::testing::TempDir folder;
   ASSERT_TRUE(folder.ok());
-  folder.Write("Test/Zone", ZoneFile(kFooter));
-  folder.Write("posixrules", ZoneFile(kFooter));
-  folder.Write("NotAZone", "TZ data it is not\n");
-  folder.Write("Version1", ZoneFile("", 2, '\0'));
-  folder.Write("EmptyFooter", ZoneFile("\n\n", 1));
-  folder.Write("BadFooter", ZoneFile("\nFST3FDT\n", 2));
+  for (const auto& [name, bytes] : {std::pair{"Test/Zone", ZoneFile(kFooter)},
+                                    {"posixrules", ZoneFile(kFooter)},
+                                    {"NotAZone", std::string("TZ data it is not\n")},
+                                    {"Version1", ZoneFile("", 2, '\0')},
+                                    {"EmptyFooter", ZoneFile("\n\n", 1)},
+                                    {"BadFooter", ZoneFile("\nFST3FDT\n", 2)}})
+    folder.Write(name, bytes);
   ASSERT_EQ(mkfifo(folder.Path("Fifo").c_str(), 0600), 0);
   const struct {
     const char* tz;  // nullptr: TZ unset
@@ -68,11 +70,8 @@ TEST(LoadZone, DecidesAsTheCLibraryDoes) {
   };
   for (const auto& c : cases) {
     SCOPED_TRACE(c.tz == nullptr ? "(unset)" : c.tz);
-    datetimelib::platform::ZoneSettings settings;
-    if (c.tz != nullptr) settings.tz = c.tz;
-    settings.zone_folder = folder.path();
-    settings.localtime_path = folder.Path("Version1");
-    const auto zone = LoadZone(settings);
+    const auto zone = LoadZone({c.tz ? std::optional<std::string>(c.tz) : std::nullopt,
+                                folder.path(), folder.Path("Version1")});
     EXPECT_EQ(zone.source, c.source);
     EXPECT_EQ(datetimelib::testing::RuleText(CurrentRule(zone)), c.rule);
   }

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <ctime>
 #include <filesystem>
 #include <optional>
 
@@ -28,6 +29,7 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
       "Africa/Casablanca",               // daylight time suspended each Ramadan
       "Pacific/Apia",                    // skipped a whole day in 2011
       "Asia/Kolkata",                    // fractional offset, no DST since 1945
+      "Asia/Kathmandu",                  // "+0545": a quarter-hour offset, named by it
       "America/Sao_Paulo",               // DST abolished in 2019
       "Europe/Moscow",                   // permanent summer time 2011-2014
       "Etc/GMT-14",                      // no transitions at all
@@ -38,7 +40,10 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
       "XXX3YYY,J60/0,J300/25",            // Julian days without 29 February
       "ZZZ-12:45ZZY,0/0,364/-3",          // zero-based days, negative time
       "<+0530>-5:30",                     // no DST, quoted name
+      "XST-1XDT0,M10.5.0/3,M3.5.0/3",     // winter as daylight time; gaps at 03:00
       "Foo/Bar",                          // unreadable: UTC named "Foo"
+      ":Foo/Bar",                         // the same after the ":"
+      "<+0545>",                          // unreadable: UTC named "+0545"
       "",                                 // empty: UTC
   };
   for (const char* zone : zones) {
@@ -46,6 +51,40 @@ TEST(ZoneEngine, AgreesWithGlibcOnSampleZones) {
     const auto report = datetimelib::testing::CheckAgreementWithGlibc(zone, 3);
     EXPECT_GT(report.instants_checked, 190000);
     EXPECT_TRUE(report.mismatches.empty()) << report.mismatches.front();
+  }
+}
+
+// Beyond 2038 the footer rule answers, as periods laid out up to 2100 (2099 the
+// last year) and per instant past them: still localtime_r's offsets, at the
+// first instant of 2100 too (a change falls on it in the second zone); and the
+// first type before a zone file's first transition (1800).
+TEST(ZoneEngine, AgreesWithGlibcPastTheLaidOutPeriods) {
+  constexpr std::int64_t k2100 = 4102444800, k2045 = 2366841600, k1800 = -5364662400;
+  for (const char* zone :
+       {"America/New_York", "XST0XDT-1,J1/0,J60/0", "XST-1XDT0,M10.5.0/3,M3.5.0/3"}) {
+    TzGuard tz(zone);
+    for (const std::int64_t from : {k2045, k2100 - 300 * 86400, k1800}) {
+      for (std::int64_t t = from; t < from + 400 * 86400;
+           t += t >= k2100 - 3 && t < k2100 + 3 ? 1 : 86399) {
+        const std::time_t instant = static_cast<std::time_t>(t);
+        std::tm libc{};
+        localtime_r(&instant, &libc);
+        ASSERT_EQ(BreakDownLocal(t).utc_offset, libc.tm_gmtoff) << zone << " " << t;
+      }
+    }
+    // Local times of 2101 every half hour, gaps and folds included, as mktime
+    // composes them; a repeated one at its first instant, which mktime may not give.
+    for (std::int64_t civil = k2100 + 365 * 86400; civil < k2100 + 730 * 86400;
+         civil += 1800) {
+      const std::time_t as_utc = static_cast<std::time_t>(civil);
+      std::tm fields{};
+      gmtime_r(&as_utc, &fields);
+      fields.tm_isdst = -1;
+      const std::int64_t expected = mktime(&fields), ours = ComposeLocal(civil);
+      if (ours == expected) continue;
+      ASSERT_LT(ours, expected) << zone << " " << civil;
+      ASSERT_EQ(ours + BreakDownLocal(ours).utc_offset, civil) << zone << " " << civil;
+    }
   }
 }
 
