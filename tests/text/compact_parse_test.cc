@@ -130,6 +130,7 @@ TEST(ParseTolvaneDateTime, Outcomes) {
       // The field constructor refuses the fields; the reader refuses their text.
       {"05-Jan-1969.10:00UTC", false, 777, "1969/1/5 10:0:0"},
       {"18-Jan-2038.23:00", false, 777, "2038/1/18 23:0:0"},  // past 2^31 in New York
+      {"05-Jan-2003.2147483647:00", false, 777, "2003/1/5 2147483647:0:0"},
       {nullptr, false, 777, "0/0/0 0:0:0"},
       // Carried out of the range: the reader refuses the canonical text.
       {"00-Jan-1970", false, 0, "1969-12-31 00:00:00"},  // ParseDateTime's outOfRange
