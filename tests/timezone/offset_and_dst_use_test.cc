@@ -1,12 +1,8 @@
 #include <gtest/gtest.h>
 
 #include <cstdlib>
-#include <filesystem>
-#include <optional>
 
 #include "AdDateTime.h"
-#include "support/fixed_clock.h"
-#include "support/temp_dir.h"
 #include "support/tz_guard.h"
 
 namespace {
@@ -38,29 +34,6 @@ TEST(TimeZoneQueries, FollowTheZoneInForceAtEachCall) {
     EXPECT_EQ(AdDateTime::GetGMTOffset(), c.minutes) << c.tz;
     EXPECT_EQ(AdDateTime::UsesDST(), c.uses_dst) << c.tz;
   }
-}
-
-// The answers come from the thread's compiled zone, which a zone file replaced
-// under the same name retires within a second.
-TEST(TimeZoneQueries, FollowAReplacedZoneFile) {
-  datetimelib::testing::TempDir folder;
-  ASSERT_TRUE(folder.ok());
-  std::filesystem::copy_file("/usr/share/zoneinfo/Asia/Tokyo", folder.Path("Here"));
-  std::optional<datetimelib::testing::FixedNow> now(std::in_place, 1000000000);
-  const datetimelib::testing::TzGuard tz(folder.Path("Here").c_str());
-  EXPECT_EQ(AdDateTime::GetGMTOffset(), -540.0);
-  EXPECT_EQ(AdDateTime::UsesDST(), 0);
-  std::filesystem::copy_file("/usr/share/zoneinfo/America/New_York",
-                             folder.Path("Here.new"));
-  std::filesystem::rename(folder.Path("Here.new"), folder.Path("Here"));
-  now.reset();
-  now.emplace(1000000001);
-  EXPECT_EQ(AdDateTime::GetGMTOffset(), 300.0);
-  EXPECT_EQ(AdDateTime::UsesDST(), 1);
-  std::string start;
-  std::string end;
-  AdDateTime::GenerateDSTDates(2026, start, end);
-  EXPECT_EQ(start, "2026-03-08 01:59:59");
 }
 
 }  // namespace

@@ -118,15 +118,6 @@ TEST(FieldConstructor, SkippedAndRepeatedLocalTimesAreDeterministic) {
   }
 }
 
-TEST(FieldConstructor, FollowsTzChangedBetweenCalls) {
-  TzGuard tz("UTC");
-  const AdDateTime value(AdTime(0));
-  EXPECT_EQ(value.GetHour(), 0);
-  TzGuard::Set("<-02>2");
-  EXPECT_EQ(value.GetHour(), 22);
-  EXPECT_EQ(AdDateTime(1970, 1, 1, 3, 0, 0).GetCTime().GetTime(), 5 * 3600);
-}
-
 TEST(Status, TransitionsAndKeptText) {
   TzGuard tz("UTC");
   AdDateTime value;

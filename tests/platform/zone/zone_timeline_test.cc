@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <optional>
 
+#include "AdDateTime.h"
 #include "platform/civil/civil.h"
 #include "platform/zone/local_time.h"
 #include "support/fixed_clock.h"
@@ -139,6 +140,7 @@ TEST(CurrentZone, SeesReplacedZoneFile) {
   std::filesystem::rename(folder.Path("Here.new"), folder.Path("Here"));
   now.reset();
   now.emplace(1000000001);
+  EXPECT_EQ(AdDateTime::GetGMTOffset(), -330.0);  // the zone questions look too
   EXPECT_EQ(BreakDownLocal(0).utc_offset, 19800);
 }
 
