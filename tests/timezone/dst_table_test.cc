@@ -65,8 +65,8 @@ TEST_F(DstTableTest, NoTable) {
   }
 }
 
-// Tables that cannot be read give the rule's dates. (A long line is passed over
-// by table_lines_test and the dst_table fuzz corpus.)
+// Tables that cannot be read give the rule's dates. (The dst_table fuzz corpus
+// holds the line rules, long lines among them.)
 TEST_F(DstTableTest, TablesWithoutEntries) {
   // A regular file whose first read fails (this process's memory at address 0),
   // which no user, root included, can read.
