@@ -51,4 +51,17 @@ void BM_DstDates_Datetimelib(benchmark::State& state) {
 }
 DATETIMELIB_BENCHMARK(BM_DstDates_Datetimelib);
 
+// Without a table folder the dates come from the zone's rule, as above.
+void BM_DstDatesNoTable_Datetimelib(benchmark::State& state) {
+  std::string start;
+  std::string end;
+  int year = 1970;
+  for (auto _ : state) {
+    benchmark::DoNotOptimize(AdDateTime::GetDSTDates(nullptr, year, start, end));
+    year = year == 2037 ? 1970 : year + 1;
+  }
+  state.SetItemsProcessed(state.iterations());
+}
+DATETIMELIB_BENCHMARK(BM_DstDatesNoTable_Datetimelib);
+
 }  // namespace

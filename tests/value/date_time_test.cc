@@ -164,4 +164,33 @@ TEST(Status, FromCountClockAndTm) {
   EXPECT_EQ(value.Format(kCanonical), "2147485547/6/18 14:0:0");
 }
 
+// Each thread remembers its last breakdown, so that a getter after another on
+// the same value is cheap. Every getter must still answer for its own value and
+// for the zone as it stands at the call, with the same count asked again
+// between changes.
+TEST(Getters, FollowTheValueAndTheZoneBetweenCalls) {
+  const AdDateTime value(AdTime(1000000000));  // 2001-09-09 01:46:40 UTC
+  const AdDateTime next(AdTime(1000000000 + 3600 + 60 + 1));
+  TzGuard tz("UTC");
+  EXPECT_EQ(value.GetHour(), 1);
+  EXPECT_EQ(next.GetHour(), 2);
+  EXPECT_EQ(next.GetMinute(), 47);
+  EXPECT_EQ(value.GetMinute(), 46);
+  EXPECT_EQ(value.GetSecond(), 40);
+  struct {
+    const char* tz;
+    long day, hour, minute;
+  } const zones[] = {
+      {"Asia/Tokyo", 9, 10, 46},  {"America/New_York", 8, 21, 46},
+      {"Asia/Kolkata", 9, 7, 16}, {"<+0545>-5:45", 9, 7, 31},
+      {"Asia/Tokyo", 9, 10, 46},
+  };
+  for (const auto& zone : zones) {
+    TzGuard::Set(zone.tz);
+    EXPECT_EQ(value.GetDay(), zone.day) << zone.tz;
+    EXPECT_EQ(value.GetHour(), zone.hour) << zone.tz;
+    EXPECT_EQ(value.GetMinute(), zone.minute) << zone.tz;
+  }
+}
+
 }  // namespace

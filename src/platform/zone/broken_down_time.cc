@@ -7,7 +7,7 @@
 namespace datetimelib::platform {
 
 BrokenDownTime BrokenDownAt(std::int64_t civil_seconds, std::int32_t utc_offset,
-                            bool is_dst, const char* abbreviation) {
+                            bool is_dst, const Abbreviation& abbreviation) {
   const CivilFields civil = CivilFieldsOf(civil_seconds);
   BrokenDownTime out;
   out.year = static_cast<int>(civil.date.year);
@@ -20,14 +20,13 @@ BrokenDownTime BrokenDownAt(std::int64_t civil_seconds, std::int32_t utc_offset,
   out.yearday = civil.yearday;
   out.utc_offset = utc_offset;
   out.is_dst = is_dst;
-  const std::size_t length = strnlen(abbreviation, sizeof out.abbreviation - 1);
-  std::memcpy(out.abbreviation, abbreviation, length);
-  out.abbreviation[length] = '\0';
+  std::memcpy(out.abbreviation, abbreviation, sizeof out.abbreviation);
   return out;
 }
 
 BrokenDownTime BreakDownUtc(std::int64_t unix_seconds) {
-  return BrokenDownAt(unix_seconds, 0, false, "GMT");
+  static constexpr Abbreviation kGmt = "GMT";
+  return BrokenDownAt(unix_seconds, 0, false, kGmt);
 }
 
 std::tm ToTm(const BrokenDownTime& fields) {

@@ -8,6 +8,10 @@
 
 namespace datetimelib::platform {
 
+// A zone abbreviation as the engine keeps it: NUL-terminated and NUL-padded to
+// its full size, so that it is copied whole, without measuring it.
+using Abbreviation = char[16];
+
 struct BrokenDownTime {
   int year;                 // with century
   int month;                // [1:12]
@@ -19,14 +23,13 @@ struct BrokenDownTime {
   int yearday;              // [0:365], 0 == 1 January
   std::int32_t utc_offset;  // seconds east of UTC, daylight saving included
   bool is_dst;
-  char abbreviation[16];  // zone abbreviation, NUL-terminated, possibly cut
+  Abbreviation abbreviation;  // NUL-terminated, cut to 15 bytes
 };
 
 // The fields of `civil_seconds` (see civil.h) read in a zone whose offset is
-// `utc_offset` seconds east, with that daylight flag and abbreviation (cut to 15
-// bytes).
+// `utc_offset` seconds east, with that daylight flag and abbreviation.
 BrokenDownTime BrokenDownAt(std::int64_t civil_seconds, std::int32_t utc_offset,
-                            bool is_dst, const char* abbreviation);
+                            bool is_dst, const Abbreviation& abbreviation);
 
 // The UTC fields of an instant; abbreviation "GMT". Pure arithmetic.
 BrokenDownTime BreakDownUtc(std::int64_t unix_seconds);

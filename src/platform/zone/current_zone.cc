@@ -7,6 +7,7 @@
 #include "platform/clock.h"
 #include "platform/regular_file.h"
 #include "platform/thread_slot.h"
+#include "platform/zone/local_time.h"
 #include "platform/zone/tz_watch.h"
 #include "platform/zone/zone_source.h"
 
@@ -24,6 +25,11 @@ struct ZoneCache {
   std::string watched_path;
   std::optional<FileIdentity> watched_identity;
   std::int64_t last_file_check = 0;  // wall-clock second of the last check
+  // The last breakdown in `zone`: users read a value's fields one getter at a
+  // time, and each getter after the first finds them here.
+  bool memo_filled = false;
+  std::int64_t memo_instant = 0;
+  BrokenDownTime memo_fields;
 };
 
 // True at most once per second of the wall clock; a clock that moves backwards
@@ -39,6 +45,7 @@ void Compile(ZoneCache* cache) {
   const ZoneSettings settings = ZoneSettings::FromEnvironment();
   const LoadedZone loaded = LoadZone(settings);
   cache->zone.emplace(ZoneTimeline::Build(loaded, settings.tz));
+  cache->memo_filled = false;
   cache->tz = settings.tz;
   cache->watched_path.clear();
   cache->watched_identity.reset();
@@ -51,9 +58,8 @@ void Compile(ZoneCache* cache) {
   FileCheckDue(cache);  // no check again within this second
 }
 
-}  // namespace
-
-const ZoneTimeline& CurrentZone() {
+// The thread's cache, its zone compiled anew if TZ or the zone file changed.
+ZoneCache& CheckedCache() {
   ZoneCache& cache = ThreadSlot<ZoneCache>::Get();
   if (!cache.tz_watch.Unchanged()) {
     cache.tz_watch.Refresh();
@@ -62,7 +68,25 @@ const ZoneTimeline& CurrentZone() {
              IdentityOf(cache.watched_path) != cache.watched_identity) {
     Compile(&cache);
   }
-  return *cache.zone;
+  return cache;
+}
+
+}  // namespace
+
+const ZoneTimeline& CurrentZone() { return *CheckedCache().zone; }
+
+// Here rather than in local_time.cc: the breakdown is remembered in the cache.
+// The thread's last breakdown is answered again without being worked out, until
+// the zone is compiled anew; a getter after another on the same value costs the
+// checks above and no more.
+BrokenDownTime BreakDownLocal(std::int64_t unix_seconds) {
+  ZoneCache& cache = CheckedCache();
+  if (!cache.memo_filled || cache.memo_instant != unix_seconds) {
+    cache.memo_fields = cache.zone->BreakDown(unix_seconds);
+    cache.memo_instant = unix_seconds;
+    cache.memo_filled = true;
+  }
+  return cache.memo_fields;
 }
 
 }  // namespace datetimelib::platform

@@ -1,8 +1,9 @@
 // The process's time zone as it stands at this call, compiled.
 //
 // Every local-time answer and every zone question of the library comes from
-// here. Each thread keeps the zone it compiled last, so the read path takes no
-// lock and shares nothing. Every call checks that TZ still says what it said
+// here. Each thread keeps the zone it compiled last, and its last breakdown
+// (BreakDownLocal is defined beside it), so the read path takes no lock and
+// shares nothing. Every call checks that TZ still says what it said
 // (tz_watch.h), so a TZ changed with setenv is seen by the next call. A replaced
 // zone file (TZ naming a file, or /etc/localtime when TZ is unset) is seen within
 // a second: its identity is checked at most once a second of the coarse clock. TZDIR is

@@ -5,9 +5,7 @@
 
 namespace datetimelib::platform {
 
-BrokenDownTime BreakDownLocal(std::int64_t unix_seconds) {
-  return CurrentZone().BreakDown(unix_seconds);
-}
+// BreakDownLocal is defined in current_zone.cc, beside the breakdown it keeps.
 
 std::int64_t ComposeLocal(std::int64_t civil_seconds) {
   return CurrentZone().Compose(civil_seconds);

@@ -29,7 +29,7 @@ class ZoneTimeline {
   struct LocalType {
     std::int32_t utc_offset;  // seconds east of UTC
     bool is_dst;
-    char abbreviation[16];  // NUL-terminated, cut to 15 bytes
+    Abbreviation abbreviation;  // cut to 15 bytes, NUL-padded
   };
 
   // The zone as the C library would read it. `tz` is TZ as it was when `zone` was

@@ -27,6 +27,7 @@ struct EnvironmentGuard {
 };
 
 char tz_entry[] = "TZ=UTC0";  // given to putenv, then changed in place
+char long_tz_entry[] = "TZ=America/Argentina/Buenos_Aires";  // likewise, by word
 
 // Each step changes TZ in one of the ways the rest of the suite does not (there,
 // TZ is set over a TZ already set); the watch must notice it, and after a
@@ -47,6 +48,13 @@ TEST(TzWatch, NoticesEveryWayTzChanges) {
       {[] { putenv(tz_entry); }, "UTC0"},
       // putenv's string changed in place.
       {[] { std::memcpy(tz_entry, "TZ=EST5", 7); }, "EST5"},
+      // A longer value changed in place: its first, a middle and its last byte,
+      // then cut short.
+      {[] { putenv(long_tz_entry); }, "America/Argentina/Buenos_Aires"},
+      {[] { long_tz_entry[3] = 'a'; }, "america/Argentina/Buenos_Aires"},
+      {[] { long_tz_entry[3 + 12] = 'e'; }, "america/Argeetina/Buenos_Aires"},
+      {[] { long_tz_entry[3 + 29] = 'S'; }, "america/Argeetina/Buenos_AireS"},
+      {[] { long_tz_entry[3 + 16] = '\0'; }, "america/Argeetin"},
       // unsetenv: nothing left of the value read before.
       {[] { unsetenv("TZ"); }, "(unset)"},
   };
