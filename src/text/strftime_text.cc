@@ -113,8 +113,10 @@ void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
     WriteStrftime(fields, pattern, nullptr, out);
     return;
   }
-  out->resize(kCanonicalLength);
-  char* p = out->data();
+  // Written on the stack and copied once: resizing the string first would fill
+  // it with zeros only to overwrite them.
+  char text[kCanonicalLength];
+  char* p = text;
   p = WriteFourDigits(p, fields.year);
   *p++ = '-';
   p = WriteTwoDigits(p, fields.month);
@@ -126,6 +128,7 @@ void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
   p = WriteTwoDigits(p, fields.minute);
   *p++ = ':';
   WriteTwoDigits(p, fields.second);
+  out->assign(text, kCanonicalLength);
 }
 
 void WritePatternInLocale(const platform::BrokenDownTime& fields, const char* pattern,

@@ -31,10 +31,16 @@ bool FitsIn32Bits(std::int64_t value) { return value >= INT32_MIN && value <= IN
 std::optional<std::int64_t> CivilSeconds64(std::int64_t year, std::int64_t month,
                                            std::int64_t day, std::int64_t hour,
                                            std::int64_t minute, std::int64_t second) {
-  const std::int64_t month0 = month - 1;
-  const std::int64_t year_carry = FloorDiv(month0, 12);
-  const int month_norm = static_cast<int>(month0 - year_carry * 12) + 1;  // [1:12]
-  const std::int64_t days = DaysFromCivil(year + year_carry, month_norm, 1) + (day - 1);
+  std::int64_t days;
+  if (month >= 1 && month <= 12 && year > -kFastCivilYears && year < kFastCivilYears) {
+    // Fields as people and readers give them: no month carries into the year.
+    days = FastDaysFromCivil(year, static_cast<int>(month), 1) + (day - 1);
+  } else {
+    const std::int64_t month0 = month - 1;
+    const std::int64_t year_carry = FloorDiv(month0, 12);
+    const int month_norm = static_cast<int>(month0 - year_carry * 12) + 1;  // [1:12]
+    days = DaysFromCivil(year + year_carry, month_norm, 1) + (day - 1);
+  }
   const std::int64_t total = days * kSecondsPerDay + hour * 3600 + minute * 60 + second;
   if (total <= -kLimit64 || total >= kLimit64) return std::nullopt;
   return total;

@@ -67,6 +67,30 @@ constexpr CivilDay CivilFromDays(std::int64_t days) {
   return CivilDay{year_of_era + era * 400 + (month <= 2 ? 1 : 0), month, day};
 }
 
+// DaysFromCivil for |year| < kFastCivilYears, in unsigned arithmetic with
+// constant divisors: the composition's hot path.
+inline constexpr std::int64_t kFastCivilYears = 20000;
+constexpr std::int64_t FastDaysFromCivil(std::int64_t year, int month, int day) {
+  constexpr std::uint32_t kEraShift = 82;  // 400-year eras that make every year positive
+  const std::uint32_t y = static_cast<std::uint32_t>(year + 400 * kEraShift) -
+                          (month <= 2 ? 1U : 0U);  // the year of this March
+  const std::uint32_t shifted_month =
+      static_cast<std::uint32_t>(month <= 2 ? month + 9 : month - 3);  // March == 0
+  const std::uint32_t century = y / 100;
+  const std::uint32_t day_of_year = (153 * shifted_month + 2) / 5;
+  // 1461 * y / 4 is 365 y + y / 4, and century / 4 is y / 400.
+  const std::uint32_t days = 1461 * y / 4 - century + century / 4 + day_of_year;
+  return std::int64_t{days} + day - 1 - (719468 + std::int64_t{146097} * kEraShift);
+}
+
+static_assert(FastDaysFromCivil(1970, 1, 1) == 0);
+static_assert(FastDaysFromCivil(2000, 2, 29) == DaysFromCivil(2000, 2, 29));
+static_assert(FastDaysFromCivil(1900, 3, 1) == DaysFromCivil(1900, 3, 1));
+static_assert(FastDaysFromCivil(-kFastCivilYears + 1, 1, 1) ==
+              DaysFromCivil(-kFastCivilYears + 1, 1, 1));
+static_assert(FastDaysFromCivil(kFastCivilYears - 1, 12, 31) ==
+              DaysFromCivil(kFastCivilYears - 1, 12, 31));
+
 // Days within which the 32-bit forms below are exact (about 23 000 years either
 // side of 1970).
 inline constexpr std::int64_t kFastCivilLimit = std::int64_t{1} << 23;

@@ -58,6 +58,14 @@ TEST(Civil, SecondsCarryLikeTimegm) {
           << year << "/" << month;
     }
   }
+  // Months within the year take a shorter path for most years: the same days.
+  for (std::int64_t year = -kFastCivilYears - 2; year <= kFastCivilYears + 2; ++year) {
+    for (int month = 1; month <= 12; ++month) {
+      ASSERT_EQ(CivilSeconds(year, month, 31, 0, 0, 0),
+                (DaysFromCivil(year, month, 1) + 30) * kSecondsPerDay)
+          << year << "/" << month;
+    }
+  }
   for (const std::int64_t t : {kWide - 1, 1 - kWide})
     EXPECT_EQ(CivilSeconds(1970, 1, 1, 0, 0, t), t);
   EXPECT_FALSE(CivilSeconds(1970, 1, 1, 0, 0, kWide));
