@@ -18,8 +18,9 @@ namespace {
 // 01:00 GMT in March) is a local time that the clocks skip, and composing it
 // would move it to 02:00. Fields outside the range give the text that an
 // outOfRange value keeps for them.
-std::string TransitionText(const platform::TransitionRule& transition, int year,
-                           std::int32_t shift_seconds) {
+// Written into `out` in place, so that a caller's strings keep their buffers.
+void WriteTransitionText(const platform::TransitionRule& transition, int year,
+                         std::int32_t shift_seconds, std::string* out) {
   // |civil| < 2^47 for every int year: 2^31 years of 2^25 seconds.
   const std::int64_t civil =
       platform::TransitionInYear(transition, year).CivilSeconds() + shift_seconds;
@@ -29,10 +30,11 @@ std::string TransitionText(const platform::TransitionRule& transition, int year,
   const platform::CivilDay date = platform::CivilFromDays(days);
   const AdDateTime value(date.year, date.month, date.day, second_of_day / 3600,
                          second_of_day / 60 % 60, second_of_day % 60);
-  if (!value.IsValid()) return value.Format(kCanonicalPattern);
-  std::string text;
-  WritePattern(platform::BreakDownUtc(civil), kCanonicalPattern, &text);
-  return text;
+  if (!value.IsValid()) {
+    value.FormatInto(*out, kCanonicalPattern);
+    return;
+  }
+  WritePattern(platform::BreakDownUtc(civil), kCanonicalPattern, out);
 }
 
 }  // namespace
@@ -44,8 +46,8 @@ void WriteRuleDates(const platform::PosixRule& rule, int year, std::string* star
     end->clear();
     return;
   }
-  *start = TransitionText(rule.start, year, -1);
-  *end = TransitionText(rule.end, year, 0);
+  WriteTransitionText(rule.start, year, -1, start);
+  WriteTransitionText(rule.end, year, 0, end);
 }
 
 }  // namespace datetimelib
