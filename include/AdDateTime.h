@@ -19,9 +19,9 @@
 //
 // Values are plain objects with value semantics; the library keeps no reference to
 // any of them, starts no threads and takes no locks. The only state it keeps
-// between calls is each thread's own (its compiled zone, the locales it opened,
-// the reading forms of the locales it read in last), and none of it changes an
-// answer. Any member may be called from many threads at once on distinct values.
+// between calls is each thread's own (its compiled zone and its last breakdown,
+// the locales it opened, the reading forms of the locales it read in last), and
+// none of it changes an answer. Any member may be called from many threads at once on distinct values.
 //
 // Example:
 //
@@ -189,7 +189,10 @@ class DATETIMELIB_API AdDateTime {
   //
   // Each getter breaks the seconds count down into local time at the moment of
   // the call and returns one field. The status is not looked at: a value that is
-  // not `valid` gives the fields of whatever count it holds.
+  // not `valid` gives the fields of whatever count it holds. Each thread keeps
+  // its last breakdown, so reading several fields of one value costs about one
+  // breakdown; a change of `TZ` or of the zone file is still seen by the next
+  // getter.
 
   long GetYear() const;       // 1970 to 2038 for a valid value
   long GetMonth() const;      // 1 to 12
