@@ -1,54 +1,46 @@
 #include "platform/zone/tz_watch.h"
 
-#include <unistd.h>
-
-#include <cstdint>
-#include <cstring>
-
 namespace datetimelib::platform {
 namespace {
-
-// Whether the n bytes at a and b are equal, reading each byte of both once at
-// most and none beyond the n: words of eight, the last one overlapping the one
-// before. Zone names are short, and this costs less than a call to memcmp.
-bool SameBytes(const char* a, const char* b, std::size_t n) {
-  if (n < sizeof(std::uint64_t)) {
-    for (std::size_t i = 0; i < n; ++i) {
-      if (a[i] != b[i]) return false;
-    }
-    return true;
-  }
-  const auto word = [](const char* p) {
-    std::uint64_t w;
-    std::memcpy(&w, p, sizeof w);
-    return w;
-  };
-  std::uint64_t differ = 0;
-  for (std::size_t i = 0; i + sizeof(std::uint64_t) < n; i += sizeof(std::uint64_t)) {
-    differ |= word(a + i) ^ word(b + i);
-  }
-  const std::size_t last = n - sizeof(std::uint64_t);
-  return (differ | (word(a + last) ^ word(b + last))) == 0;
-}
 
 bool IsTzEntry(const char* entry) {
   return entry[0] == 'T' && entry[1] == 'Z' && entry[2] == '=';
 }
 
+// The environment array the process started with; written once, before main or
+// before dlopen returns, and only read afterwards.
+char** initial_environment = nullptr;
+
+#if defined(__GLIBC__)
+// glibc calls the functions of .init_array with argc, argv and envp, in the
+// executable and in every shared library, also one opened later with dlopen.
+// envp is `environ` as it is then, but the kernel placed the first environment
+// array just after argv's terminating null, and argv is always the original.
+void RecordInitialEnvironment(int argc, char** argv, char** /*envp*/) {
+  if (argv != nullptr && argc >= 0) initial_environment = argv + argc + 1;
+}
+__attribute__((section(".init_array"), used)) void (*const record_initial_environment)(
+    int, char**, char**) = &RecordInitialEnvironment;
+#endif
+
 }  // namespace
 
-bool TzWatch::Unchanged() const {
+TzWatch::TzWatch() : lasting_(initial_environment) {}
+
+bool TzWatch::UnchangedAnyArray() const {
   char** const current = environ;
   if (current == nullptr || current != environment_) return false;
   const std::size_t count = entries_.size();
-  for (std::size_t i = 0; i < count; ++i) {
-    if (current[i] != entries_[i]) return false;
+  if (current != lasting_) {
+    for (std::size_t i = 0; i < count; ++i) {
+      if (current[i] != entries_[i]) return false;
+    }
+    if (!value_) return current[count] == nullptr;
+  } else if (!value_) {
+    return true;  // TZ can only come in a new array
+  } else if (current[count - 1] != entries_[count - 1]) {
+    return false;
   }
-  if (!value_) return current[count] == nullptr;
-  // TZ's own text may have been changed in place (a string given to putenv).
-  // Its entry is the same pointer as at Refresh(), so the value's bytes and its
-  // NUL were there to read then and still are: a text changed in place keeps
-  // its buffer.
   return SameBytes(entries_[count - 1] + 3, value_->c_str(), value_->size() + 1);
 }
 

@@ -11,9 +11,21 @@
 // The comparison reads a slot only after the one before it matched a non-null
 // pointer, so it never reads past the end of an environment that shrank, even
 // one that was freed and allocated again at the same address.
+//
+// The environment the process started with is the exception, and the common
+// case: its array lies on the main thread's stack and is never freed, so TZ's
+// slot is read directly, and nothing before it. In that array nothing is ever
+// added in place (setenv and putenv copy it to a new one when they add) and
+// unsetenv moves every later entry down, so TZ's slot alone says whether TZ
+// still reads the same. Only a program that writes a "TZ=" entry into a slot
+// before it with its own hands goes unseen, as it would by glibc's localtime.
 #ifndef DATETIMELIB_PLATFORM_ZONE_TZ_WATCH_H_
 #define DATETIMELIB_PLATFORM_ZONE_TZ_WATCH_H_
 
+#include <unistd.h>
+
+#include <cstdint>
+#include <cstring>
 #include <optional>
 #include <string>
 #include <vector>
@@ -22,8 +34,26 @@ namespace datetimelib::platform {
 
 class TzWatch {
  public:
+  // `lasting`: an environment array that is never freed, read as above; by
+  // default the one the process started with (none where it is not known).
+  TzWatch();
+  explicit TzWatch(char** lasting) : lasting_(lasting) {}
+
   // Whether TZ reads as it did when Refresh() was last called (false before).
-  bool Unchanged() const;
+  // Inline for the case of every call: the lasting array, TZ set.
+  bool Unchanged() const {
+    char** const current = environ;
+    if (current != lasting_ || current != environment_ || current == nullptr || !value_) {
+      return UnchangedAnyArray();
+    }
+    const std::size_t slot = entries_.size() - 1;
+    // TZ's own text may have been changed in place (a string given to putenv).
+    // Its entry is the same pointer as at Refresh(), so the value's bytes and
+    // its NUL were there to read then and still are: a text changed in place
+    // keeps its buffer.
+    return current[slot] == entries_[slot] &&
+           SameBytes(entries_[slot] + 3, value_->c_str(), value_->size() + 1);
+  }
 
   // Reads the environment afresh.
   void Refresh();
@@ -32,6 +62,32 @@ class TzWatch {
   const std::optional<std::string>& value() const { return value_; }
 
  private:
+  bool UnchangedAnyArray() const;
+
+  // Whether the n bytes at a and b are equal, reading each byte of both once at
+  // most and none beyond the n: words of eight, the last one overlapping the one
+  // before. Zone names are short, and this costs less than a call to memcmp.
+  static bool SameBytes(const char* a, const char* b, std::size_t n) {
+    if (n < sizeof(std::uint64_t)) {
+      for (std::size_t i = 0; i < n; ++i) {
+        if (a[i] != b[i]) return false;
+      }
+      return true;
+    }
+    const auto word = [](const char* p) {
+      std::uint64_t w;
+      std::memcpy(&w, p, sizeof w);
+      return w;
+    };
+    std::uint64_t differ = 0;
+    for (std::size_t i = 0; i + sizeof(std::uint64_t) < n; i += sizeof(std::uint64_t)) {
+      differ |= word(a + i) ^ word(b + i);
+    }
+    const std::size_t last = n - sizeof(std::uint64_t);
+    return (differ | (word(a + last) ^ word(b + last))) == 0;
+  }
+
+  char** lasting_;
   char** environment_ = nullptr;  // `environ` at the last Refresh()
   std::vector<char*> entries_;    // its entries up to TZ's, or all of them
   std::optional<std::string> value_;

@@ -83,4 +83,37 @@ TEST(TzWatch, ShrunkenEnvironmentIsNotOverread) {
   }
 }
 
+// The environment the process started with is never freed, and the watch reads
+// only TZ's slot of it. Here a static array stands in for it.
+char lasting_a[] = "A=1";
+char lasting_tz[] = "TZ=Europe/Lisbon";
+char lasting_b[] = "B=2";
+char* lasting[] = {lasting_a, lasting_tz, lasting_b, nullptr};
+
+TEST(TzWatch, ReadsOnlyTzsSlotOfTheFirstEnvironment) {
+  EnvironmentGuard guard;
+  clearenv();  // frees glibc's own array, if it had one, before `environ` moves
+  environ = lasting;
+  TzWatch watch(lasting);
+  watch.Refresh();
+  const struct {
+    void (*change)();
+    const char* tz;  // afterwards
+  } steps[] = {
+      {[] { lasting_tz[3 + 12] = 'X'; }, "Europe/LisboX"},
+      // unsetenv moves the later entries down in place: TZ leaves its slot.
+      {[] { unsetenv("A"); }, "Europe/LisboX"},
+      {[] { unsetenv("TZ"); }, "(unset)"},
+      // Adding copies the array.
+      {[] { setenv("TZ", "UTC", 1); }, "UTC"},
+  };
+  for (const auto& step : steps) {
+    ASSERT_TRUE(watch.Unchanged());
+    step.change();
+    EXPECT_FALSE(watch.Unchanged()) << step.tz;
+    watch.Refresh();
+    EXPECT_EQ(watch.value().value_or("(unset)"), step.tz);
+  }
+}
+
 }  // namespace
