@@ -24,17 +24,14 @@ void WriteTransitionText(const platform::TransitionRule& transition, int year,
   // |civil| < 2^47 for every int year: 2^31 years of 2^25 seconds.
   const std::int64_t civil =
       platform::TransitionInYear(transition, year).CivilSeconds() + shift_seconds;
-  const std::int64_t days = platform::FloorDiv(civil, platform::kSecondsPerDay);
-  const std::int64_t second_of_day =
-      civil - days * platform::kSecondsPerDay;  // [0, 86399]
-  const platform::CivilDay date = platform::CivilFromDays(days);
-  const AdDateTime value(date.year, date.month, date.day, second_of_day / 3600,
-                         second_of_day / 60 % 60, second_of_day % 60);
+  const platform::BrokenDownTime fields = platform::BreakDownUtc(civil);
+  const AdDateTime value(fields.year, fields.month, fields.day, fields.hour,
+                         fields.minute, fields.second);
   if (!value.IsValid()) {
     value.FormatInto(*out, kCanonicalPattern);
     return;
   }
-  WritePattern(platform::BreakDownUtc(civil), kCanonicalPattern, out);
+  WritePattern(fields, kCanonicalPattern, out);
 }
 
 }  // namespace

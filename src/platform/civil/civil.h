@@ -40,7 +40,8 @@ constexpr int DaysInMonth(std::int64_t year, int month) {  // month [1:12]
 
 // Days from 1970-01-01 to year-month-day; month [1:12], day [1:31].
 // For |year| < 2^31 every intermediate stays below 2^40 in magnitude.
-constexpr std::int64_t DaysFromCivil(std::int64_t year, int month, int day) {
+// DaysFromCivil below takes a shorter path for most years.
+constexpr std::int64_t DaysFromCivilByEras(std::int64_t year, int month, int day) {
   const std::int64_t y = year - (month <= 2 ? 1 : 0);
   const std::int64_t era = FloorDiv(y, 400);
   const std::int64_t year_of_era = y - era * 400;                            // [0, 399]
@@ -51,7 +52,8 @@ constexpr std::int64_t DaysFromCivil(std::int64_t year, int month, int day) {
   return era * 146097 + day_of_era - 719468;  // 719468: 0000-03-01 to 1970-01-01
 }
 
-constexpr CivilDay CivilFromDays(std::int64_t days) {
+// The date of a day count; CivilFromDays below takes a shorter path for most.
+constexpr CivilDay CivilFromDaysByEras(std::int64_t days) {
   const std::int64_t z = days + 719468;
   const std::int64_t era = FloorDiv(z, 146097);
   const std::int64_t day_of_era = z - era * 146097;  // [0, 146096]
@@ -66,30 +68,6 @@ constexpr CivilDay CivilFromDays(std::int64_t days) {
       static_cast<int>(shifted_month < 10 ? shifted_month + 3 : shifted_month - 9);
   return CivilDay{year_of_era + era * 400 + (month <= 2 ? 1 : 0), month, day};
 }
-
-// DaysFromCivil for |year| < kFastCivilYears, in unsigned arithmetic with
-// constant divisors: the composition's hot path.
-inline constexpr std::int64_t kFastCivilYears = 20000;
-constexpr std::int64_t FastDaysFromCivil(std::int64_t year, int month, int day) {
-  constexpr std::uint32_t kEraShift = 82;  // 400-year eras that make every year positive
-  const std::uint32_t y = static_cast<std::uint32_t>(year + 400 * kEraShift) -
-                          (month <= 2 ? 1U : 0U);  // the year of this March
-  const std::uint32_t shifted_month =
-      static_cast<std::uint32_t>(month <= 2 ? month + 9 : month - 3);  // March == 0
-  const std::uint32_t century = y / 100;
-  const std::uint32_t day_of_year = (153 * shifted_month + 2) / 5;
-  // 1461 * y / 4 is 365 y + y / 4, and century / 4 is y / 400.
-  const std::uint32_t days = 1461 * y / 4 - century + century / 4 + day_of_year;
-  return std::int64_t{days} + day - 1 - (719468 + std::int64_t{146097} * kEraShift);
-}
-
-static_assert(FastDaysFromCivil(1970, 1, 1) == 0);
-static_assert(FastDaysFromCivil(2000, 2, 29) == DaysFromCivil(2000, 2, 29));
-static_assert(FastDaysFromCivil(1900, 3, 1) == DaysFromCivil(1900, 3, 1));
-static_assert(FastDaysFromCivil(-kFastCivilYears + 1, 1, 1) ==
-              DaysFromCivil(-kFastCivilYears + 1, 1, 1));
-static_assert(FastDaysFromCivil(kFastCivilYears - 1, 12, 31) ==
-              DaysFromCivil(kFastCivilYears - 1, 12, 31));
 
 // Days within which the 32-bit forms below are exact (about 23 000 years either
 // side of 1970).
@@ -149,6 +127,43 @@ constexpr CivilFields FastCivilFields(std::int64_t civil_seconds) {
   return out;
 }
 
+// DaysFromCivil for |year| < kFastCivilYears, in unsigned arithmetic with
+// constant divisors: the composition's hot path.
+inline constexpr std::int64_t kFastCivilYears = 20000;
+constexpr std::int64_t FastDaysFromCivil(std::int64_t year, int month, int day) {
+  constexpr std::uint32_t kEraShift = 82;  // 400-year eras that make every year positive
+  const std::uint32_t y = static_cast<std::uint32_t>(year + 400 * kEraShift) -
+                          (month <= 2 ? 1U : 0U);  // the year of this March
+  const std::uint32_t shifted_month =
+      static_cast<std::uint32_t>(month <= 2 ? month + 9 : month - 3);  // March == 0
+  const std::uint32_t century = y / 100;
+  const std::uint32_t day_of_year = (153 * shifted_month + 2) / 5;
+  // 1461 * y / 4 is 365 y + y / 4, and century / 4 is y / 400.
+  const std::uint32_t days = 1461 * y / 4 - century + century / 4 + day_of_year;
+  return std::int64_t{days} + day - 1 - (719468 + std::int64_t{146097} * kEraShift);
+}
+
+static_assert(FastDaysFromCivil(1970, 1, 1) == 0);
+static_assert(FastDaysFromCivil(2000, 2, 29) == DaysFromCivilByEras(2000, 2, 29));
+static_assert(FastDaysFromCivil(1900, 3, 1) == DaysFromCivilByEras(1900, 3, 1));
+static_assert(FastDaysFromCivil(-kFastCivilYears + 1, 1, 1) ==
+              DaysFromCivilByEras(-kFastCivilYears + 1, 1, 1));
+static_assert(FastDaysFromCivil(kFastCivilYears - 1, 12, 31) ==
+              DaysFromCivilByEras(kFastCivilYears - 1, 12, 31));
+
+// The calendar conversions for any year or day count, by the 32-bit forms where
+// they are exact.
+constexpr std::int64_t DaysFromCivil(std::int64_t year, int month, int day) {
+  return year > -kFastCivilYears && year < kFastCivilYears
+             ? FastDaysFromCivil(year, month, day)
+             : DaysFromCivilByEras(year, month, day);
+}
+constexpr CivilDay CivilFromDays(std::int64_t days) {
+  return days > -kFastCivilLimit && days < kFastCivilLimit
+             ? FastCivilFields(days * kSecondsPerDay).date
+             : CivilFromDaysByEras(days);
+}
+
 // 0 == Sunday ... 6 == Saturday. Day 0 (1970-01-01) was a Thursday.
 constexpr int WeekdayFromDays(std::int64_t days) {
   return static_cast<int>(FloorMod(days + 4, 7));
@@ -184,9 +199,9 @@ static_assert(CivilFromDays(11016).month == 2 && CivilFromDays(11016).day == 29)
 static_assert(CivilFromDays(-1).year == 1969);
 static_assert(WeekdayFromDays(0) == 4 && WeekdayFromDays(-4) == 0);
 static_assert(FastCivilFields(-kFastCivilSecondsLimit + 1).date.year ==
-              CivilFromDays(-kFastCivilLimit).year);
+              CivilFromDaysByEras(-kFastCivilLimit).year);
 static_assert(FastCivilFields(kFastCivilSecondsLimit - 1).date.day ==
-              CivilFromDays(kFastCivilLimit - 1).day);
+              CivilFromDaysByEras(kFastCivilLimit - 1).day);
 static_assert(FastCivilFields(0).weekday == 4 && FastCivilFields(-1).hour == 23 &&
               FastCivilFields(-1).yearday == 364 &&
               FastCivilFields(951782400).yearday == 59);
