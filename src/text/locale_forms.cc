@@ -113,6 +113,8 @@ bool ToFields(FormValues values, const LocaleVocabulary& vocabulary,
     if (values.hour12 < 1 || values.hour12 > 12) return false;
     fields.hour = values.hour12 % 12 + (values.pm == 1 ? 12 : 0);
   } else if (values.hour >= 0) {
+    // An AM/PM word beside a 24-hour clock must be the one of that hour.
+    if (values.pm >= 0 && (values.hour >= 12) != (values.pm == 1)) return false;
     fields.hour = values.hour;
   }
   if (values.minute >= 0) fields.minute = values.minute;

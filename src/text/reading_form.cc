@@ -248,7 +248,10 @@ bool Classify(ReadingForm* form) {
   form->has_time = hours == 1 && minutes == 1 && seconds <= 1;
   if (years + months + days != 0 && !form->has_date) return false;
   if (hours + minutes + seconds != 0 && !form->has_time) return false;
-  if (count(FormStep::kHour12) != count(FormStep::kAmPm)) return false;
+  // %p goes with a 12-hour clock, and some locales write it after a 24-hour one.
+  if (count(FormStep::kHour12) > count(FormStep::kAmPm) || count(FormStep::kAmPm) > 1) {
+    return false;
+  }
   if (weekdays > 1 || (weekdays == 1 && !form->has_date)) return false;
   if (count(FormStep::kEraName) > count(FormStep::kEraYear)) return false;
   if (count(FormStep::kCentury) > count(FormStep::kYear2)) return false;
@@ -398,12 +401,13 @@ int LocaleVocabulary::Match(FormStep step, std::string_view text, std::size_t po
 }
 
 int LocaleVocabulary::MatchDigits(std::string_view text, std::size_t position,
-                                  std::size_t* length) const {
+                                  std::size_t most, std::size_t* length) const {
   int found = -1;
   std::size_t longest = 0;
   for (std::size_t number = 0; number < digits_.size(); ++number) {
     const std::string& digits = digits_[number];
-    if (digits.size() > longest && text.substr(position, digits.size()) == digits) {
+    if (digits.size() > longest && digits.size() <= most &&
+        text.substr(position, digits.size()) == digits) {
       longest = digits.size();
       found = static_cast<int>(number);
     }
@@ -422,42 +426,44 @@ std::optional<ReadingForm> CompileForm(std::string_view pattern, const LangInfo&
   return form;
 }
 
-bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
-               std::string_view text, std::size_t* position, FormValues* values) {
-  std::size_t at = *position;
-  FormValues read;
-  for (const FormToken& token : form.tokens) {
+namespace {
+
+// A number as a step stores it: a two-digit year with its century.
+void SetNumber(FormStep step, int number, FormValues* values) {
+  if (step == FormStep::kYear2) number += number < 69 ? 2000 : 1900;
+  *FieldOf(step, values) = number;
+}
+
+// Reads by the steps of `form` from `first` on, at `at`, with what was read so
+// far in `read`.
+bool MatchSteps(const ReadingForm& form, std::size_t first,
+                const LocaleVocabulary& vocabulary, std::string_view text, std::size_t at,
+                FormValues read, std::size_t* position, FormValues* values) {
+  for (std::size_t i = first; i < form.tokens.size(); ++i) {
+    const FormToken& token = form.tokens[i];
     std::size_t length = 0;
     switch (token.step) {
       case FormStep::kLiteral:
         if (text.substr(at, token.literal.size()) != token.literal) return false;
         at += token.literal.size();
-        break;
+        continue;
       case FormStep::kBlanks:
         if (at >= text.size() || !IsBlank(text[at])) return false;
         SkipBlanks(text, &at);
-        break;
+        continue;
       case FormStep::kAnyBlanks:
         SkipBlanks(text, &at);
-        break;
+        continue;
       case FormStep::kYear4:
         if (!ReadDigits(text, &at, 4, 4, &read.year)) return false;
-        break;
-      case FormStep::kYear2:
-        if (token.alternative_digits) {
-          read.year = vocabulary.MatchDigits(text, at, &length);
-          at += length;
-        }
-        if (read.year < 0 && !ReadDigits(text, &at, 2, 2, &read.year)) return false;
-        read.year += read.year < 69 ? 2000 : 1900;
-        break;
+        continue;
       case FormStep::kEraYear:
         if (!ReadDigits(text, &at, 1, 4, &read.era_year)) return false;
-        break;
+        continue;
       case FormStep::kZoneOffset:
         if (!ReadOffset(text, &at, &read.zone_offset)) return false;
         read.has_zone_offset = true;
-        break;
+        continue;
       case FormStep::kZoneName: {
         const std::size_t start = at;
         while (at < text.size() && at - start < kLongestZoneName &&
@@ -466,7 +472,7 @@ bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
         }
         if (at == start) return false;
         read.zone_name = text.substr(start, at - start);
-        break;
+        continue;
       }
       case FormStep::kMonthName:
       case FormStep::kWeekdayName:
@@ -476,25 +482,42 @@ bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
         *field = vocabulary.Match(token.step, text, at, &length);
         if (*field < 0) return false;
         at += length;
-        break;
+        continue;
       }
-      default:  // a one- or two-digit number
-        if (token.blank_padded) SkipBlanks(text, &at);
-        if (token.alternative_digits) {
-          const int number = vocabulary.MatchDigits(text, at, &length);
-          if (number >= 0) {
-            *FieldOf(token.step, &read) = number;
-            at += length;
-            break;
-          }
-        }
-        if (!ReadDigits(text, &at, 1, 2, FieldOf(token.step, &read))) return false;
+      default:  // a number of one or two digits; two for %y
         break;
     }
+    if (token.blank_padded) SkipBlanks(text, &at);
+    if (token.alternative_digits) {
+      // The locale's digits may run into those of the next number ("廿四" is 24,
+      // or 20 then 4): each reading, longest first, is tried with the rest.
+      for (std::size_t bound = text.size() - at;;) {
+        const int number = vocabulary.MatchDigits(text, at, bound, &length);
+        if (number < 0) break;
+        FormValues tried = read;
+        SetNumber(token.step, number, &tried);
+        if (MatchSteps(form, i + 1, vocabulary, text, at + length, tried, position,
+                       values)) {
+          return true;
+        }
+        bound = length - 1;
+      }
+    }
+    const std::size_t fewest = token.step == FormStep::kYear2 ? 2 : 1;
+    int number = 0;
+    if (!ReadDigits(text, &at, fewest, 2, &number)) return false;
+    SetNumber(token.step, number, &read);
   }
   *position = at;
   *values = read;
   return true;
+}
+
+}  // namespace
+
+bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
+               std::string_view text, std::size_t* position, FormValues* values) {
+  return MatchSteps(form, 0, vocabulary, text, *position, FormValues{}, position, values);
 }
 
 }  // namespace datetimelib

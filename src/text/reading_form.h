@@ -120,9 +120,11 @@ class LocaleVocabulary {
   int Match(FormStep step, std::string_view text, std::size_t position,
             std::size_t* length) const;
 
-  // The number 0..99 that the locale's own digits write at `text[position]`,
-  // the longest that fits, and the bytes it takes; -1 when none is there.
-  int MatchDigits(std::string_view text, std::size_t position, std::size_t* length) const;
+  // The number 0..99 that the locale's own digits write at `text[position]`
+  // in at most `most` bytes, the longest, and the bytes it takes; -1 when none
+  // is there.
+  int MatchDigits(std::string_view text, std::size_t position, std::size_t most,
+                  std::size_t* length) const;
 
   const std::vector<Era>& eras() const { return eras_; }
 
