@@ -1,0 +1,16 @@
+#!/bin/sh
+# Compiles every locale source with a time category (LC_TIME) into OUT, UTF-8,
+# two at a time; nothing is installed system-wide. A locale already compiled
+# after its source changed last is kept, so a second run costs nothing. Sources
+# that localedef cannot compile (no whole locale) are left for the sweep to
+# skip.
+#   compile_all_locales.sh OUT [SOURCES]
+set -eu
+out=$1
+sources=${2:-/usr/share/i18n/locales}
+mkdir -p "$out"
+grep -l '^LC_TIME' "$sources"/* | while read -r source; do basename "$source"; done |
+  OUT=$out SOURCES=$sources xargs -P2 -I{} sh -c '
+    compiled="$OUT/{}.utf8/LC_TIME"
+    if [ -e "$compiled" ] && [ "$compiled" -nt "$SOURCES/{}" ]; then exit 0; fi
+    localedef --no-archive -i "{}" -f UTF-8 "$OUT/{}.utf8" >/dev/null 2>&1 || true'
