@@ -27,23 +27,34 @@ namespace {
 
 using datetimelib::testing::LocaleForm;
 
-std::vector<std::string> CompiledLocales(const std::string& folder) {
-  std::vector<std::string> names;
+struct CompiledLocale {
+  std::string source;  // "de_DE@euro"
+  std::string name;    // what newlocale takes: "de_DE.UTF-8@euro"
+};
+
+// The folders localedef wrote: "ll_CC.utf8", or "ll_CC.utf8@modifier".
+std::vector<CompiledLocale> CompiledLocales(const std::string& folder) {
+  std::vector<CompiledLocale> locales;
   DIR* dir = opendir(folder.c_str());
-  if (dir == nullptr) return names;
+  if (dir == nullptr) return locales;
   while (const dirent* entry = readdir(dir)) {
     const std::string name = entry->d_name;
+    const std::size_t codeset = name.find(".utf8");
     struct stat info {};
-    const std::string suffix = ".utf8";
-    if (name.size() > suffix.size() &&
-        name.compare(name.size() - suffix.size(), suffix.size(), suffix) == 0 &&
-        stat((folder + "/" + name + "/LC_TIME").c_str(), &info) == 0) {
-      names.push_back(name.substr(0, name.size() - suffix.size()));
+    if (codeset == std::string::npos ||
+        stat((folder + "/" + name + "/LC_TIME").c_str(), &info) != 0) {
+      continue;
     }
+    const std::string modifier = name.substr(codeset + 5);
+    locales.push_back({name.substr(0, codeset) + modifier,
+                       name.substr(0, codeset) + ".UTF-8" + modifier});
   }
   closedir(dir);
-  std::sort(names.begin(), names.end());
-  return names;
+  std::sort(locales.begin(), locales.end(),
+            [](const CompiledLocale& a, const CompiledLocale& b) {
+              return a.source < b.source;
+            });
+  return locales;
 }
 
 std::set<std::string> Exceptions(const std::string& readme) {
@@ -87,12 +98,12 @@ int main(int argc, char** argv) {
   // Before any locale or zone is opened; the process has one thread.
   setenv("LOCPATH", folder.c_str(), 1);
   setenv("TZ", "America/New_York", 1);
-  const std::vector<std::string> locales = CompiledLocales(folder);
+  const std::vector<CompiledLocale> locales = CompiledLocales(folder);
   const std::set<std::string> exceptions = Exceptions(readme);
   int passed = 0, excepted = 0, failed = 0, not_locales = 0;
-  for (const std::string& name : locales) {
+  for (const auto& [name, open_name] : locales) {
     // localedef writes some files even for a source that is no whole locale.
-    const locale_t locale = newlocale(LC_ALL_MASK, (name + ".UTF-8").c_str(), nullptr);
+    const locale_t locale = newlocale(LC_ALL_MASK, open_name.c_str(), nullptr);
     if (locale == nullptr) {
       ++not_locales;
       continue;
