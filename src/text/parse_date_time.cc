@@ -31,7 +31,8 @@ bool ParseLocaleDateTime(std::string_view text, DateTimeFields* out) {
 }
 
 bool FitsInCount(std::int64_t seconds) {
-  return seconds >= 0 && seconds <= std::numeric_limits<std::int32_t>::max();
+  return seconds >= std::numeric_limits<std::int32_t>::min() &&
+         seconds <= std::numeric_limits<std::int32_t>::max();
 }
 
 }  // namespace
@@ -44,6 +45,7 @@ int AdDateTime::ParseDateTime(const char* text, std::uint32_t /*flags*/) {
   if (!ParseLocaleDateTime(input, &f)) {
     status_ = invalid;
   } else {
+    const std::int32_t before = seconds_;
     SetDateTime(f.year, f.month, f.day, f.hour, f.minute, f.second);
     if (status_ == valid && datetimelib::NamesZone(f)) {
       // The zone named picks the reading; the field constructor has judged the
@@ -54,8 +56,10 @@ int AdDateTime::ParseDateTime(const char* text, std::uint32_t /*flags*/) {
       const std::optional<std::int64_t> instant =
           datetimelib::InstantInNamedZone(local, f, time_alone, seconds_);
       if (!instant) {
+        seconds_ = before;  // unreadable: the count stays as it was
         status_ = invalid;
       } else if (!FitsInCount(*instant)) {
+        seconds_ = 0;  // as the field constructor leaves a count it cannot hold
         status_ = outOfRange;
       } else {
         seconds_ = static_cast<std::int32_t>(*instant);
@@ -82,11 +86,15 @@ int AdDateTime::ParseDateTimeGMT(const char* text) {
         datetimelib::platform::DaysFromCivil(f.year, f.month, f.day);
     std::optional<std::int64_t> instant = days * datetimelib::platform::kSecondsPerDay +
                                           f.hour * 3600 + f.minute * 60 + f.second;
-    if (datetimelib::NamesZone(f))
+    if (datetimelib::NamesZone(f)) {
       instant = datetimelib::UtcInstantOfNamedZone(f, *instant);
+    }
+    // An offset may move the count past the range the fields were tested
+    // against: 1970-01-01 to 2038-01-18 23:59:59 in UTC.
+    constexpr std::int64_t kLastInRange = 2147471999;
     if (!instant) {
       status_ = invalid;
-    } else if (!FitsInCount(*instant)) {
+    } else if (*instant < 0 || *instant > kLastInRange) {
       status_ = outOfRange;
     } else {
       seconds_ = static_cast<std::int32_t>(*instant);

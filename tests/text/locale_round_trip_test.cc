@@ -111,23 +111,26 @@ TEST(NamedZone, PicksTheReadingOfALocalTime) {
   for (const ZoneRow& row : rows) {
     TzGuard tz(row.tz);
     ThreadLocale thread((std::string(row.locale) + ".UTF-8").c_str());
-    AdDateTime value;
+    AdDateTime value(AdTime(1234567890));
     const int read = value.ParseDateTime(row.text);
     EXPECT_EQ(read == 1 ? value.GetCTime().GetTime() : -1, row.seconds) << row.text;
-    if (read == 0) {
+    if (read == 0) {  // refused: the count as it was
       EXPECT_EQ(value.GetStatus(), AdDateTime::invalid) << row.text;
+      EXPECT_EQ(value.GetCTime().GetTime(), 1234567890) << row.text;
     }
   }
 }
 
-// Read as UTC, an offset in the text moves the fields to UTC; an abbreviation
-// other than GMT or UTC is refused.
+// Read as UTC, an offset in the text moves the fields to UTC, and the count
+// must stay within the range; an abbreviation other than GMT or UTC is refused.
 TEST(NamedZone, ReadAsUtc) {
   DATETIMELIB_NEED_TEST_LOCALES();
   ThreadLocale nb("nb_NO.UTF-8");
   AdDateTime value;
   EXPECT_EQ(value.ParseDateTimeGMT("31. okt. 2004 kl. 01.30 -0500"), 1);
   EXPECT_EQ(value.GetCTime().GetTime(), 1099204200);
+  EXPECT_EQ(value.ParseDateTimeGMT("01. jan. 1970 kl. 00.30 +0100"), 0);  // 23:30 UTC
+  EXPECT_EQ(value.GetStatus(), AdDateTime::outOfRange);
   ThreadLocale en("en_US.UTF-8");
   EXPECT_EQ(value.ParseDateTimeGMT("Sun 31 Oct 2004 06:30:00 AM GMT"), 1);
   EXPECT_EQ(value.GetCTime().GetTime(), 1099204200);
