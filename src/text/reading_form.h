@@ -12,14 +12,17 @@
 //             one or two digits (what strftime writes, and what people type)
 //   %e %k %l  the same after any blanks (strftime pads these with a blank)
 //   %O...     the same number in the locale's own digits (ALT_DIGITS), or in
-//             ASCII digits, which strftime writes where the locale has none
+//             ASCII digits, which strftime writes where the locale has none;
+//             digits that run into the next number's ("廿四": 24, or 20 and 4)
+//             are tried each way with the rest of the form
 //   %C        the century, one or two digits, with %y (the year in it)
 //   %EC %Ey   an era's name, and the year in an era (one to four digits); %EY
 //             is the era's own form. Without eras: %y and %Y.
 //   %b %B %h  a month name of the locale, full or abbreviated, in any case, an
 //             abbreviation with or without its final "."
 //   %a %A     a weekday name, likewise; it must be the weekday of the date
-//   %p %P     the locale's AM or PM word, in any case
+//   %p %P     the locale's AM or PM word, in any case; beside a 24-hour clock
+//             it must be the one of the hour
 //   %z        a numeric offset from UTC, "+hhmm" or "-hhmm"
 //   %Z        a zone abbreviation: letters, digits, "+" and "-" ("EST", "+0530")
 //   blank     one or more blanks (space or tab)
