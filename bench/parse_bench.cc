@@ -62,6 +62,22 @@ void BM_ParseLocalFraction_Datetimelib(benchmark::State& state) {
 }
 DATETIMELIB_BENCHMARK(BM_ParseLocalFraction_Datetimelib);
 
+// A locale's own form, "%x %X" of the thread's locale ("C": "05/17/03
+// 14:03:09"), which takes the locale reader rather than the canonical text's.
+void BM_ParseLocaleForm_Datetimelib(benchmark::State& state) {
+  std::vector<std::string> texts;
+  for (const std::int32_t count : GetInputs().counts) {
+    texts.push_back(AdDateTime(AdTime(count)).Format("%x %X"));
+  }
+  std::size_t i = static_cast<std::size_t>(state.thread_index()) * 1000;
+  AdDateTime value;
+  for (auto _ : state) {
+    benchmark::DoNotOptimize(value.ParseDateTime(texts[At(i++)].c_str()));
+  }
+  state.SetItemsProcessed(state.iterations());
+}
+DATETIMELIB_BENCHMARK(BM_ParseLocaleForm_Datetimelib);
+
 void BM_ParseLocal_StrptimeMktime(benchmark::State& state) {
   const auto& texts = GetInputs().local_texts;
   std::size_t i = static_cast<std::size_t>(state.thread_index()) * 1000;

@@ -298,6 +298,12 @@ class DATETIMELIB_API AdDateTime {
   // 2003"). A two-digit year is read only where the locale writes one: 69..99
   // are 1969..1999, 00..68 are 2000..2068. Impossible fields (30 February, hour
   // 24, second 60) make the text unreadable.
+  // A zone in the text (a form with %Z or %z) must be the current zone's at
+  // those fields, or the text is unreadable; it picks the instant: in New York
+  // "Sun 31 Oct 2004 01:30:00 AM EST" is the second 01:30 of that night, and
+  // without a zone the first. A time of day alone takes any abbreviation or
+  // offset of the zone's rule. ParseDateTimeGMT applies an offset, and takes
+  // "GMT" and "UTC" alone of the abbreviations.
   // A text the thread's locale refuses whose 20th byte is "." (the canonical text
   // with a fraction of a second) is read once more, cut to its first 19 bytes, in
   // the user's default locale: "2003-05-17 14:03:09.250" reads as 14:03:09.

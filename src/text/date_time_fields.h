@@ -2,6 +2,8 @@
 #ifndef DATETIMELIB_TEXT_DATE_TIME_FIELDS_H_
 #define DATETIMELIB_TEXT_DATE_TIME_FIELDS_H_
 
+#include <string_view>
+
 #include "platform/civil/civil.h"
 
 namespace datetimelib {
@@ -15,7 +17,16 @@ struct DateTimeFields {
   int hour = 0;     // [0:23]
   int minute = 0;   // [0:59]
   int second = 0;   // [0:59]
+  // The zone the text names, if it names one: a numeric offset ("-0500") or
+  // an abbreviation ("EST"), which points into the text read.
+  bool has_zone_offset = false;
+  int zone_offset = 0;  // seconds east of UTC
+  std::string_view zone_name;
 };
+
+inline bool NamesZone(const DateTimeFields& f) {
+  return f.has_zone_offset || !f.zone_name.empty();
+}
 
 // Readers refuse what no calendar has: month 13, 30 February, hour 24, minute
 // 60, second 60. Years run from 1 to 9999.

@@ -54,6 +54,7 @@ std::string Key(const ReadingForm& form) {
   for (const FormToken& token : form.tokens) {
     key.push_back(static_cast<char>('A' + static_cast<int>(token.step)));
     key.push_back(token.blank_padded ? '_' : ' ');
+    key.push_back(token.alternative_digits ? 'O' : ' ');
     key += token.literal;
     key.push_back('\0');
   }
@@ -81,8 +82,27 @@ class FormCollector {
   LocaleForms forms_;
 };
 
+// The year with century of a year in an era: in the era named, else in the
+// first era that holds the date.
+bool ResolveEraYear(const std::vector<Era>& eras, FormValues* values) {
+  for (std::size_t era = 0; era < eras.size(); ++era) {
+    if (values->era >= 0 && static_cast<std::size_t>(values->era) != era) continue;
+    const std::optional<int> year =
+        YearOfEra(eras[era], values->era_year, values->month, values->day);
+    if (year) {
+      values->year = *year;
+      return true;
+    }
+  }
+  return false;
+}
+
 // The fields of a whole reading; false where no calendar has them.
-bool ToFields(const FormValues& values, DateTimeFields* out) {
+bool ToFields(FormValues values, const LocaleVocabulary& vocabulary,
+              DateTimeFields* out) {
+  if (values.era_year >= 0 && !ResolveEraYear(vocabulary.eras(), &values)) return false;
+  // A century written apart replaces the one the two-digit year implies.
+  if (values.century >= 0) values.year = values.century * 100 + values.year % 100;
   DateTimeFields fields;  // 1899-12-30 00:00:00 until the text says otherwise
   if (values.year >= 0) {
     fields.year = values.year;
@@ -93,10 +113,15 @@ bool ToFields(const FormValues& values, DateTimeFields* out) {
     if (values.hour12 < 1 || values.hour12 > 12) return false;
     fields.hour = values.hour12 % 12 + (values.pm == 1 ? 12 : 0);
   } else if (values.hour >= 0) {
+    // An AM/PM word beside a 24-hour clock must be the one of that hour.
+    if (values.pm >= 0 && (values.hour >= 12) != (values.pm == 1)) return false;
     fields.hour = values.hour;
   }
   if (values.minute >= 0) fields.minute = values.minute;
   if (values.second >= 0) fields.second = values.second;
+  fields.has_zone_offset = values.has_zone_offset;
+  fields.zone_offset = values.zone_offset;
+  fields.zone_name = values.zone_name;
   if (!IsPossibleDateTime(fields)) return false;
   if (values.weekday >= 0 &&
       platform::WeekdayFromDays(platform::DaysFromCivil(fields.year, fields.month,
@@ -119,6 +144,14 @@ bool ReadRest(const ReadingForm& form, const LocaleVocabulary& vocabulary,
     values->month = read.month;
     values->day = read.day;
     values->weekday = read.weekday;
+    values->century = read.century;
+    values->era = read.era;
+    values->era_year = read.era_year;
+  }
+  if (read.has_zone_offset || !read.zone_name.empty()) {
+    values->has_zone_offset = read.has_zone_offset;
+    values->zone_offset = read.zone_offset;
+    values->zone_name = read.zone_name;
   }
   if (form.has_time) {
     values->hour = read.hour;
@@ -136,17 +169,20 @@ LocaleForms BuildLocaleForms(const platform::LangInfo& words) {
   const bool has_am_pm = !words.am.empty() && !words.pm.empty();
   FormCollector collector;
   for (const char* pattern : kPatterns) {
-    std::optional<ReadingForm> form = CompileForm(pattern, words);
-    if (!form || (!has_am_pm && Has(*form, FormStep::kAmPm))) continue;
-    if (Has(*form, FormStep::kYear2)) {
-      ReadingForm four_digits = *form;
-      for (FormToken& token : four_digits.tokens) {
-        if (token.step == FormStep::kYear2) token.step = FormStep::kYear4;
+    // With the zone the pattern writes, and without it.
+    for (const ZoneSteps zone : {ZoneSteps::kRead, ZoneSteps::kLeaveOut}) {
+      std::optional<ReadingForm> form = CompileForm(pattern, words, zone);
+      if (!form || (!has_am_pm && Has(*form, FormStep::kAmPm))) continue;
+      if (Has(*form, FormStep::kYear2)) {
+        ReadingForm four_digits = *form;
+        for (FormToken& token : four_digits.tokens) {
+          if (token.step == FormStep::kYear2) token.step = FormStep::kYear4;
+        }
+        collector.Add(std::move(*form));
+        collector.Add(std::move(four_digits));
+      } else {
+        collector.Add(std::move(*form));
       }
-      collector.Add(std::move(*form));
-      collector.Add(std::move(four_digits));
-    } else {
-      collector.Add(std::move(*form));
     }
   }
   return collector.Take();
@@ -154,11 +190,14 @@ LocaleForms BuildLocaleForms(const platform::LangInfo& words) {
 
 bool ReadWithForms(std::string_view text, const LocaleForms& forms,
                    const LocaleVocabulary& vocabulary, DateTimeFields* out) {
-  if (text.empty() || IsBlank(text.front())) return false;
+  // A leading blank is read only by a form that opens with a blank-padded
+  // number (" 4:05:07", %k).
+  if (text.empty()) return false;
   for (const auto* list : {&forms.date_times, &forms.times}) {
     for (const ReadingForm& form : *list) {
       FormValues values;
-      if (ReadRest(form, vocabulary, text, 0, &values) && ToFields(values, out)) {
+      if (ReadRest(form, vocabulary, text, 0, &values) &&
+          ToFields(values, vocabulary, out)) {
         return true;
       }
     }
@@ -168,14 +207,15 @@ bool ReadWithForms(std::string_view text, const LocaleForms& forms,
     FormValues values;
     if (!MatchForm(date, vocabulary, text, &end, &values)) continue;
     if (OnlyBlanksFrom(text, end)) {
-      if (ToFields(values, out)) return true;
+      if (ToFields(values, vocabulary, out)) return true;
       continue;
     }
     if (!IsBlank(text[end])) continue;
     while (end < text.size() && IsBlank(text[end])) ++end;
     for (const ReadingForm& time : forms.times) {
       FormValues both = values;
-      if (ReadRest(time, vocabulary, text, end, &both) && ToFields(both, out)) {
+      if (ReadRest(time, vocabulary, text, end, &both) &&
+          ToFields(both, vocabulary, out)) {
         return true;
       }
     }

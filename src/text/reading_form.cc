@@ -36,15 +36,27 @@ constexpr FieldConversion kFieldConversions[] = {
     {'B', FormStep::kMonthName, false},   {'h', FormStep::kMonthName, false},
     {'a', FormStep::kWeekdayName, false}, {'A', FormStep::kWeekdayName, false},
     {'p', FormStep::kAmPm, false},        {'P', FormStep::kAmPm, false},
+    {'C', FormStep::kCentury, false},
 };
+
+// The form that every era writes for %EY; none when they differ.
+std::optional<std::string> CommonEraFormat(const std::vector<Era>& eras) {
+  if (eras.empty()) return std::nullopt;
+  for (const Era& era : eras) {
+    if (era.format != eras.front().format) return std::nullopt;
+  }
+  return eras.front().format;
+}
 
 // Builds the steps of a pattern and of the patterns it refers to.
 class FormBuilder {
  public:
-  explicit FormBuilder(const LangInfo& words) : words_(words) {}
+  FormBuilder(const LangInfo& words, ZoneSteps zone)
+      : words_(words), eras_(ParseEras(words.eras)), zone_(zone) {}
 
-  // pattern := { blank | literal-byte | "%" flags* width? conversion }
+  // pattern := { blank | literal-byte | "%" flags* width? modifier? conversion }
   // flags   := "_" | "-" | "0" | "^" | "#"      ("_" pads numbers with blanks)
+  // modifier := "E" | "O"                       (era forms, the locale's digits)
   bool Append(std::string_view pattern, int nesting) {
     for (std::size_t i = 0; i < pattern.size();) {
       const char c = pattern[i++];
@@ -62,8 +74,17 @@ class FormBuilder {
         ++i;
       }
       while (i < pattern.size() && platform::IsAsciiDigit(pattern[i])) ++i;
+      char modifier = '\0';
+      if (i < pattern.size() && (pattern[i] == 'E' || pattern[i] == 'O')) {
+        modifier = pattern[i++];
+      }
       if (i == pattern.size()) return false;
-      if (!AppendConversion(pattern[i++], blank_padded, nesting)) return false;
+      const char conversion = pattern[i++];
+      const bool appended =
+          modifier == 'E'
+              ? AppendEraConversion(conversion, blank_padded, nesting)
+              : AppendConversion(conversion, blank_padded, modifier == 'O', nesting);
+      if (!appended) return false;
     }
     return true;
   }
@@ -77,10 +98,14 @@ class FormBuilder {
   }
 
  private:
-  bool AppendConversion(char conversion, bool blank_padded, int nesting) {
+  // %O: numbers in the locale's own digits (strftime writes ASCII digits
+  // where it has none); names as without it.
+  bool AppendConversion(char conversion, bool blank_padded, bool own_digits,
+                        int nesting) {
     for (const FieldConversion& field : kFieldConversions) {
       if (field.conversion == conversion) {
-        return AddField(field.step, blank_padded || field.blank_padded);
+        return AddField(field.step, blank_padded || field.blank_padded,
+                        own_digits && !words_.alternative_digits.empty());
       }
     }
     switch (conversion) {
@@ -91,10 +116,10 @@ class FormBuilder {
       case '%':
         AddLiteral('%');
         return true;
-      case 'Z':
       case 'z':
-        DropZone();
-        return true;
+        return AddZone(FormStep::kZoneOffset);
+      case 'Z':
+        return AddZone(FormStep::kZoneName);
       case 'x':
         return Nested(words_.date_form, nesting);
       case 'X':
@@ -116,13 +141,48 @@ class FormBuilder {
     }
   }
 
+  // As strftime writes them: the era forms where the locale has them, else
+  // what the conversion writes without "E".
+  bool AppendEraConversion(char conversion, bool blank_padded, int nesting) {
+    const auto era_or_plain = [&](const std::string& era_form, char plain) {
+      return era_form.empty() ? AppendConversion(plain, blank_padded, false, nesting)
+                              : Nested(era_form, nesting);
+    };
+    switch (conversion) {
+      case 'x':
+        return era_or_plain(words_.era_date_form, 'x');
+      case 'X':
+        return era_or_plain(words_.era_time_form, 'X');
+      case 'c':
+        return era_or_plain(words_.era_date_time_form, 'c');
+      case 'C':
+        return !eras_.empty() && AddField(FormStep::kEraName, false, false);
+      case 'y':
+        return eras_.empty() ? AddField(FormStep::kYear2, blank_padded, false)
+                             : AddField(FormStep::kEraYear, blank_padded, false);
+      case 'Y': {
+        if (eras_.empty()) return AddField(FormStep::kYear4, blank_padded, false);
+        const std::optional<std::string> format = CommonEraFormat(eras_);
+        return format && Nested(*format, nesting);
+      }
+      default:
+        return AppendConversion(conversion, blank_padded, false, nesting);
+    }
+  }
+
   bool Nested(std::string_view pattern, int nesting) {
     return nesting < kMaxNesting && Append(pattern, nesting + 1);
   }
 
-  bool AddField(FormStep step, bool blank_padded) {
-    tokens_.push_back(FormToken{step, {}, blank_padded});
+  bool AddField(FormStep step, bool blank_padded, bool own_digits) {
+    tokens_.push_back(FormToken{step, {}, blank_padded, own_digits});
     drop_next_blanks_ = false;
+    return true;
+  }
+
+  bool AddZone(FormStep step) {
+    if (zone_ == ZoneSteps::kRead) return AddField(step, false, false);
+    DropZone();
     return true;
   }
 
@@ -131,7 +191,7 @@ class FormBuilder {
     if (!tokens_.empty() && tokens_.back().step == FormStep::kLiteral) {
       tokens_.back().literal.push_back(c);
     } else {
-      tokens_.push_back(FormToken{FormStep::kLiteral, std::string(1, c), false});
+      tokens_.push_back(FormToken{FormStep::kLiteral, std::string(1, c)});
     }
   }
 
@@ -145,7 +205,7 @@ class FormBuilder {
       if (step == FormStep::kBlanks) tokens_.back().step = step;
       return;
     }
-    tokens_.push_back(FormToken{step, {}, false});
+    tokens_.push_back(FormToken{step, {}});
   }
 
   // The zone goes with the blank that separates it: the one before it, or the
@@ -159,6 +219,8 @@ class FormBuilder {
   }
 
   const LangInfo& words_;
+  const std::vector<Era> eras_;
+  const ZoneSteps zone_;
   std::vector<FormToken> tokens_;
   bool drop_next_blanks_ = false;
 };
@@ -173,7 +235,8 @@ bool Classify(ReadingForm* form) {
   const auto count = [&counts](FormStep step) {
     return counts[static_cast<std::size_t>(step)];
   };
-  const int years = count(FormStep::kYear4) + count(FormStep::kYear2);
+  const int years =
+      count(FormStep::kYear4) + count(FormStep::kYear2) + count(FormStep::kEraYear);
   const int months = count(FormStep::kMonth) + count(FormStep::kMonthName);
   const int days = count(FormStep::kDay);
   const int hours = count(FormStep::kHour) + count(FormStep::kHour12);
@@ -185,8 +248,14 @@ bool Classify(ReadingForm* form) {
   form->has_time = hours == 1 && minutes == 1 && seconds <= 1;
   if (years + months + days != 0 && !form->has_date) return false;
   if (hours + minutes + seconds != 0 && !form->has_time) return false;
-  if (count(FormStep::kHour12) != count(FormStep::kAmPm)) return false;
+  // %p goes with a 12-hour clock, and some locales write it after a 24-hour one.
+  if (count(FormStep::kHour12) > count(FormStep::kAmPm) || count(FormStep::kAmPm) > 1) {
+    return false;
+  }
   if (weekdays > 1 || (weekdays == 1 && !form->has_date)) return false;
+  if (count(FormStep::kEraName) > count(FormStep::kEraYear)) return false;
+  if (count(FormStep::kCentury) > count(FormStep::kYear2)) return false;
+  if (count(FormStep::kZoneOffset) + count(FormStep::kZoneName) > 1) return false;
   return form->has_date || form->has_time;
 }
 
@@ -206,6 +275,31 @@ bool ReadDigits(std::string_view text, std::size_t* position, std::size_t min_di
   return true;
 }
 
+// "+hhmm" or "-hhmm", as strftime writes %z, in seconds east of UTC.
+bool ReadOffset(std::string_view text, std::size_t* position, int* seconds_east) {
+  std::size_t at = *position;
+  if (at >= text.size() || (text[at] != '+' && text[at] != '-')) return false;
+  const int sign = text[at] == '-' ? -1 : 1;
+  ++at;
+  int hours = 0;
+  int minutes = 0;
+  if (!ReadDigits(text, &at, 2, 2, &hours) || !ReadDigits(text, &at, 2, 2, &minutes) ||
+      minutes > 59) {
+    return false;
+  }
+  *position = at;
+  *seconds_east = sign * (hours * 3600 + minutes * 60);
+  return true;
+}
+
+// Zone abbreviations are letters, or digits with a sign ("+0530"); the zone
+// engine keeps at most 15 bytes of one.
+constexpr std::size_t kLongestZoneName = 15;
+bool IsZoneNameByte(char c) {
+  return platform::IsAsciiDigit(c) || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') ||
+         c == '+' || c == '-';
+}
+
 void SkipBlanks(std::string_view text, std::size_t* position) {
   while (*position < text.size() && IsBlank(text[*position])) ++*position;
 }
@@ -213,20 +307,25 @@ void SkipBlanks(std::string_view text, std::size_t* position) {
 // The field each step reads, in the order of FormStep; none for blanks and
 // literals.
 constexpr int FormValues::*kFieldOfStep[] = {
-    nullptr,               // kLiteral
-    nullptr,               // kBlanks
-    nullptr,               // kAnyBlanks
-    &FormValues::year,     // kYear4
-    &FormValues::year,     // kYear2
-    &FormValues::month,    // kMonth
-    &FormValues::month,    // kMonthName
-    &FormValues::day,      // kDay
-    &FormValues::hour,     // kHour
-    &FormValues::hour12,   // kHour12
-    &FormValues::minute,   // kMinute
-    &FormValues::second,   // kSecond
-    &FormValues::pm,       // kAmPm
-    &FormValues::weekday,  // kWeekdayName
+    nullptr,                // kLiteral
+    nullptr,                // kBlanks
+    nullptr,                // kAnyBlanks
+    &FormValues::year,      // kYear4
+    &FormValues::year,      // kYear2
+    &FormValues::month,     // kMonth
+    &FormValues::month,     // kMonthName
+    &FormValues::day,       // kDay
+    &FormValues::hour,      // kHour
+    &FormValues::hour12,    // kHour12
+    &FormValues::minute,    // kMinute
+    &FormValues::second,    // kSecond
+    &FormValues::pm,        // kAmPm
+    &FormValues::century,   // kCentury
+    &FormValues::era,       // kEraName
+    &FormValues::era_year,  // kEraYear
+    nullptr,                // kZoneOffset
+    nullptr,                // kZoneName
+    &FormValues::weekday,   // kWeekdayName
 };
 static_assert(std::size(kFieldOfStep) ==
               static_cast<std::size_t>(FormStep::kWeekdayName) + 1);
@@ -254,6 +353,11 @@ LocaleVocabulary::LocaleVocabulary(const LangInfo& words,
     Add(words.am, 0, &am_pm_);
     Add(words.pm, 1, &am_pm_);
   }
+  eras_ = ParseEras(words.eras);
+  for (std::size_t era = 0; era < eras_.size(); ++era) {
+    Add(eras_[era].name, static_cast<int>(era), &era_names_);
+  }
+  digits_ = words.alternative_digits;
 }
 
 // Abbreviations such as "janv." are also read without their ".".
@@ -271,6 +375,7 @@ int LocaleVocabulary::Match(FormStep step, std::string_view text, std::size_t po
                             std::size_t* length) const {
   const NameList& list = step == FormStep::kMonthName     ? months_
                          : step == FormStep::kWeekdayName ? weekdays_
+                         : step == FormStep::kEraName     ? era_names_
                                                           : am_pm_;
   int found = -1;
   std::size_t longest = 0;
@@ -295,8 +400,25 @@ int LocaleVocabulary::Match(FormStep step, std::string_view text, std::size_t po
   return found;
 }
 
-std::optional<ReadingForm> CompileForm(std::string_view pattern, const LangInfo& words) {
-  FormBuilder builder(words);
+int LocaleVocabulary::MatchDigits(std::string_view text, std::size_t position,
+                                  std::size_t most, std::size_t* length) const {
+  int found = -1;
+  std::size_t longest = 0;
+  for (std::size_t number = 0; number < digits_.size(); ++number) {
+    const std::string& digits = digits_[number];
+    if (digits.size() > longest && digits.size() <= most &&
+        text.substr(position, digits.size()) == digits) {
+      longest = digits.size();
+      found = static_cast<int>(number);
+    }
+  }
+  *length = longest;
+  return found;
+}
+
+std::optional<ReadingForm> CompileForm(std::string_view pattern, const LangInfo& words,
+                                       ZoneSteps zone) {
+  FormBuilder builder(words, zone);
   if (!builder.Append(pattern, 0)) return std::nullopt;
   ReadingForm form;
   form.tokens = builder.Finish();
@@ -304,49 +426,98 @@ std::optional<ReadingForm> CompileForm(std::string_view pattern, const LangInfo&
   return form;
 }
 
-bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
-               std::string_view text, std::size_t* position, FormValues* values) {
-  std::size_t at = *position;
-  FormValues read;
-  for (const FormToken& token : form.tokens) {
+namespace {
+
+// A number as a step stores it: a two-digit year with its century.
+void SetNumber(FormStep step, int number, FormValues* values) {
+  if (step == FormStep::kYear2) number += number < 69 ? 2000 : 1900;
+  *FieldOf(step, values) = number;
+}
+
+// Reads by the steps of `form` from `first` on, at `at`, with what was read so
+// far in `read`.
+bool MatchSteps(const ReadingForm& form, std::size_t first,
+                const LocaleVocabulary& vocabulary, std::string_view text, std::size_t at,
+                FormValues read, std::size_t* position, FormValues* values) {
+  for (std::size_t i = first; i < form.tokens.size(); ++i) {
+    const FormToken& token = form.tokens[i];
     std::size_t length = 0;
     switch (token.step) {
       case FormStep::kLiteral:
         if (text.substr(at, token.literal.size()) != token.literal) return false;
         at += token.literal.size();
-        break;
+        continue;
       case FormStep::kBlanks:
         if (at >= text.size() || !IsBlank(text[at])) return false;
         SkipBlanks(text, &at);
-        break;
+        continue;
       case FormStep::kAnyBlanks:
         SkipBlanks(text, &at);
-        break;
+        continue;
       case FormStep::kYear4:
         if (!ReadDigits(text, &at, 4, 4, &read.year)) return false;
-        break;
-      case FormStep::kYear2:
-        if (!ReadDigits(text, &at, 2, 2, &read.year)) return false;
-        read.year += read.year < 69 ? 2000 : 1900;
-        break;
+        continue;
+      case FormStep::kEraYear:
+        if (!ReadDigits(text, &at, 1, 4, &read.era_year)) return false;
+        continue;
+      case FormStep::kZoneOffset:
+        if (!ReadOffset(text, &at, &read.zone_offset)) return false;
+        read.has_zone_offset = true;
+        continue;
+      case FormStep::kZoneName: {
+        const std::size_t start = at;
+        while (at < text.size() && at - start < kLongestZoneName &&
+               IsZoneNameByte(text[at])) {
+          ++at;
+        }
+        if (at == start) return false;
+        read.zone_name = text.substr(start, at - start);
+        continue;
+      }
       case FormStep::kMonthName:
       case FormStep::kWeekdayName:
+      case FormStep::kEraName:
       case FormStep::kAmPm: {
         int* const field = FieldOf(token.step, &read);
         *field = vocabulary.Match(token.step, text, at, &length);
         if (*field < 0) return false;
         at += length;
-        break;
+        continue;
       }
-      default:  // a one- or two-digit number
-        if (token.blank_padded) SkipBlanks(text, &at);
-        if (!ReadDigits(text, &at, 1, 2, FieldOf(token.step, &read))) return false;
+      default:  // a number of one or two digits; two for %y
         break;
     }
+    if (token.blank_padded) SkipBlanks(text, &at);
+    if (token.alternative_digits) {
+      // The locale's digits may run into those of the next number ("廿四" is 24,
+      // or 20 then 4): each reading, longest first, is tried with the rest.
+      for (std::size_t bound = text.size() - at;;) {
+        const int number = vocabulary.MatchDigits(text, at, bound, &length);
+        if (number < 0) break;
+        FormValues tried = read;
+        SetNumber(token.step, number, &tried);
+        if (MatchSteps(form, i + 1, vocabulary, text, at + length, tried, position,
+                       values)) {
+          return true;
+        }
+        bound = length - 1;
+      }
+    }
+    const std::size_t fewest = token.step == FormStep::kYear2 ? 2 : 1;
+    int number = 0;
+    if (!ReadDigits(text, &at, fewest, 2, &number)) return false;
+    SetNumber(token.step, number, &read);
   }
   *position = at;
   *values = read;
   return true;
+}
+
+}  // namespace
+
+bool MatchForm(const ReadingForm& form, const LocaleVocabulary& vocabulary,
+               std::string_view text, std::size_t* position, FormValues* values) {
+  return MatchSteps(form, 0, vocabulary, text, *position, FormValues{}, position, values);
 }
 
 }  // namespace datetimelib

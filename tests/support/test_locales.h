@@ -1,6 +1,7 @@
 // Real locales for the tests: compiled into the build folder by
-// tests/CMakeLists.txt (de_DE, en_GB, en_US, fr_FR and ja_JP, all UTF-8), found
-// through LOCPATH, which the test binary sets before any test runs.
+// tests/CMakeLists.txt (those of the locale identifiers and a few more, all
+// UTF-8), found through LOCPATH, which the test binary sets before any test
+// runs.
 #ifndef DATETIMELIB_TESTS_SUPPORT_TEST_LOCALES_H_
 #define DATETIMELIB_TESTS_SUPPORT_TEST_LOCALES_H_
 

@@ -99,9 +99,10 @@ TEST(ReadInLocale, Forms) {
       {kInvariant, "Sun May 17 14:03:09 2003", "refused"},      // a Saturday
       {kInvariant, "January May 18 14:03:09 2003", "refused"},  // no weekday
       {kInvariant, "May 17, 2003 2:30 PM", "2003-05-17 14:30:00"},
-      // en_US: %x "%m/%d/%Y", %c "%a %d %b %Y %r %Z"; no zone is read.
+      // en_US: %x "%m/%d/%Y", %c "%a %d %b %Y %r %Z", with or without the zone
+      // (ParseDateTime holds it against the current zone).
       {kEnUs, "Sat 17 May 2003 02:03:09 PM", "2003-05-17 14:03:09"},
-      {kEnUs, "Sat 17 May 2003 02:03:09 PM EDT", "refused"},
+      {kEnUs, "Sat 17 May 2003 02:03:09 PM EDT", "2003-05-17 14:03:09"},
       {kEnUs, "05/17/03", "refused"},  // writes four digits, reads no two or three
       {kEnUs, "05/17/203", "refused"},
       {kEnUs, "12:30 am", "1899-12-30 00:30:00"},

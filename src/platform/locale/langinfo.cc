@@ -3,6 +3,7 @@
 #include <langinfo.h>
 
 #include <algorithm>
+#include <cstdint>
 #include <string_view>
 
 namespace datetimelib::platform {
@@ -32,8 +33,22 @@ nl_item Nth(nl_item first, std::size_t index) {
 // Every item a locale's words and folding come from, in a fixed order.
 const std::vector<nl_item>& SourceItems() {
   static const std::vector<nl_item> items = [] {
-    std::vector<nl_item> all = {D_FMT,  T_FMT,  D_T_FMT, T_FMT_AMPM,
-                                AM_STR, PM_STR, CODESET, _NL_LOCALE_NAME(LC_CTYPE)};
+    // ERA and ALT_DIGITS compare by their first string: the name of the
+    // time category tells locales with the same first era apart.
+    std::vector<nl_item> all = {D_FMT,
+                                T_FMT,
+                                D_T_FMT,
+                                T_FMT_AMPM,
+                                AM_STR,
+                                PM_STR,
+                                CODESET,
+                                _NL_LOCALE_NAME(LC_CTYPE),
+                                _NL_LOCALE_NAME(LC_TIME),
+                                ERA_D_FMT,
+                                ERA_T_FMT,
+                                ERA_D_T_FMT,
+                                ERA,
+                                ALT_DIGITS};
     for (const nl_item first : {MON_1, ABMON_1, ALTMON_1, _NL_ABALTMON_1}) {
       for (std::size_t month = 0; month < 12; ++month) all.push_back(Nth(first, month));
     }
@@ -43,6 +58,29 @@ const std::vector<nl_item>& SourceItems() {
     return all;
   }();
   return items;
+}
+
+// ERA and ALT_DIGITS hold their strings one after another, each ended by a
+// NUL; ERA says how many through _NL_TIME_ERA_NUM_ENTRIES, and ALT_DIGITS ends
+// at an empty string or after 100.
+std::vector<std::string> Strings(nl_item item, std::size_t count, locale_t locale) {
+  std::vector<std::string> strings;
+  const char* text = nl_langinfo_l(item, locale);
+  if (text == nullptr) return strings;
+  for (std::size_t i = 0; i < count && *text != '\0'; ++i) {
+    strings.emplace_back(text);
+    text += strings.back().size() + 1;
+  }
+  return strings;
+}
+
+// The C library hands this count out in place of a pointer (its value union
+// holds a word there), so its low 32 bits are the number. No locale has many.
+std::size_t EraCount(locale_t locale) {
+  constexpr std::size_t kMostEras = 256;
+  const auto count = static_cast<std::uint32_t>(
+      reinterpret_cast<std::uintptr_t>(nl_langinfo_l(_NL_TIME_ERA_NUM_ENTRIES, locale)));
+  return count < kMostEras ? count : kMostEras;
 }
 
 }  // namespace
@@ -81,6 +119,11 @@ LangInfo ReadLangInfo(locale_t locale) {
       AddName(Item(Nth(first, day), locale), &words.weekday_names[day]);
     }
   }
+  words.era_date_form = Item(ERA_D_FMT, locale);
+  words.era_time_form = Item(ERA_T_FMT, locale);
+  words.era_date_time_form = Item(ERA_D_T_FMT, locale);
+  words.eras = Strings(ERA, EraCount(locale), locale);
+  words.alternative_digits = Strings(ALT_DIGITS, 100, locale);
   return words;
 }
 

@@ -1,5 +1,6 @@
 // What nl_langinfo_l gives of a locale's time category: its date and time
-// patterns (%x, %X, %c, %r) and its names of months, weekdays and AM/PM.
+// patterns (%x, %X, %c, %r and their era forms), its names of months, weekdays
+// and AM/PM, its eras and its own digits.
 #ifndef DATETIMELIB_PLATFORM_LOCALE_LANGINFO_H_
 #define DATETIMELIB_PLATFORM_LOCALE_LANGINFO_H_
 
@@ -25,9 +26,19 @@ struct LangInfo {
   std::array<std::vector<std::string>, 12> month_names;
   // Names of each weekday ([0] Sunday): full and abbreviated.
   std::array<std::vector<std::string>, 7> weekday_names;
+  // The era forms of %Ex, %EX and %Ec; empty where the locale has none.
+  std::string era_date_form;
+  std::string era_time_form;
+  std::string era_date_time_form;
+  // The locale's eras, each "direction:offset:start:end:name:format" as the
+  // locale source writes it ("+:1:-543/01/01:+*:B.E.:%EC %Ey").
+  std::vector<std::string> eras;
+  // How %O writes 0, 1, ... (at most 99); empty where the locale writes ASCII.
+  std::vector<std::string> alternative_digits;
 };
 
-// The patterns and names of the time category of `locale`, which must not be LC_GLOBAL_LOCALE.
+// The patterns and names of the time category of `locale`, which must not be
+// LC_GLOBAL_LOCALE.
 LangInfo ReadLangInfo(locale_t locale);
 
 // The C library's texts that a locale's words and its case folding come from:
