@@ -7,29 +7,41 @@
 #include "text/digits.h"
 #include "text/english_names.h"
 
-void AdDateTime::FormatTolvaneInto(std::string& out) const {
-  // One breakdown, so that all six fields describe the same instant. The status
-  // is not consulted: every value writes the count it holds.
-  const auto local = datetimelib::platform::BreakDownLocal(seconds_);
-  char text[32];  // "DD-Mon-YYYY.HH:MM:SS"; the year takes at most 11 bytes
-  char* p = datetimelib::WriteTwoDigits(text, local.day);
+namespace {
+
+// "DD-Mon-YYYY.HH:MM:SS" into `text`; returns its length.
+std::size_t WriteCompact(std::int32_t seconds, char (&text)[32]) {
+  // One breakdown, so that all six fields describe the same instant.
+  const auto local = datetimelib::platform::BreakDownLocal(seconds);
+  char* p =
+      datetimelib::WriteTwoDigits(text, local.day);  // the year takes at most 11 bytes
   *p++ = '-';
-  const std::string_view month = datetimelib::MonthAbbreviation(local.month);
-  std::memcpy(p, month.data(), month.size());
-  p += month.size();
+  // Every abbreviation has three letters.
+  std::memcpy(p, datetimelib::MonthAbbreviation(local.month).data(), 3);
+  p += 3;
   *p++ = '-';
-  p = datetimelib::WriteDecimal(p, local.year);
+  // Four digits for every count of 32 bits; the general writer for the rest.
+  p = local.year >= 1000 && local.year <= 9999
+          ? datetimelib::WriteFourDigits(p, local.year)
+          : datetimelib::WriteDecimal(p, local.year);
   *p++ = '.';
   p = datetimelib::WriteTwoDigits(p, local.hour);
   *p++ = ':';
   p = datetimelib::WriteTwoDigits(p, local.minute);
   *p++ = ':';
   p = datetimelib::WriteTwoDigits(p, local.second);
-  out.assign(text, static_cast<std::size_t>(p - text));
+  return static_cast<std::size_t>(p - text);
+}
+
+}  // namespace
+
+// The status is not consulted: every value writes the count it holds.
+void AdDateTime::FormatTolvaneInto(std::string& out) const {
+  char text[32];
+  out.assign(text, WriteCompact(seconds_, text));
 }
 
 std::string AdDateTime::FormatTolvane() const {
-  std::string text;
-  FormatTolvaneInto(text);
-  return text;
+  char text[32];
+  return std::string(text, WriteCompact(seconds_, text));
 }

@@ -31,13 +31,29 @@ void AdDateTime::FormatGMTInto(std::string& out, const char* pattern) const {
   datetimelib::WritePattern(datetimelib::platform::BreakDownUtc(seconds_), pattern, &out);
 }
 
+// The canonical text is built straight into the string returned: constructing
+// it from the 19 bytes costs less than assigning them to an empty one.
 std::string AdDateTime::Format(const char* pattern) const {
+  if (status_ == valid && pattern != nullptr) {
+    const auto fields = datetimelib::platform::BreakDownLocal(seconds_);
+    char canonical[datetimelib::kCanonicalLength];
+    if (datetimelib::WriteCanonicalText(fields, pattern, canonical)) {
+      return std::string(canonical, sizeof canonical);
+    }
+  }
   std::string text;
   FormatInto(text, pattern);
   return text;
 }
 
 std::string AdDateTime::FormatGMT(const char* pattern) const {
+  if (status_ == valid && pattern != nullptr) {
+    const auto fields = datetimelib::platform::BreakDownUtc(seconds_);
+    char canonical[datetimelib::kCanonicalLength];
+    if (datetimelib::WriteCanonicalText(fields, pattern, canonical)) {
+      return std::string(canonical, sizeof canonical);
+    }
+  }
   std::string text;
   FormatGMTInto(text, pattern);
   return text;

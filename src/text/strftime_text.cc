@@ -104,20 +104,15 @@ void WriteStrftime(const platform::BrokenDownTime& fields, const char* pattern,
 
 }  // namespace
 
-void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
-                  std::string* out) {
+bool WriteCanonicalText(const platform::BrokenDownTime& fields, const char* pattern,
+                        char (&text)[kCanonicalLength]) {
   // %Y writes four digits only for the years 1000 to 9999; every count of 32 bits
   // lies within them.
-  if (std::strcmp(pattern, kCanonicalPattern) != 0 || fields.year < 1000 ||
-      fields.year > 9999) {
-    WriteStrftime(fields, pattern, nullptr, out);
-    return;
+  if (fields.year < 1000 || fields.year > 9999 ||
+      std::strcmp(pattern, kCanonicalPattern) != 0) {
+    return false;
   }
-  // Written on the stack and copied once: resizing the string first would fill
-  // it with zeros only to overwrite them.
-  char text[kCanonicalLength];
-  char* p = text;
-  p = WriteFourDigits(p, fields.year);
+  char* p = WriteFourDigits(text, fields.year);
   *p++ = '-';
   p = WriteTwoDigits(p, fields.month);
   *p++ = '-';
@@ -128,7 +123,17 @@ void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
   p = WriteTwoDigits(p, fields.minute);
   *p++ = ':';
   WriteTwoDigits(p, fields.second);
-  out->assign(text, kCanonicalLength);
+  return true;
+}
+
+void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
+                  std::string* out) {
+  char text[kCanonicalLength];
+  if (WriteCanonicalText(fields, pattern, text)) {
+    out->assign(text, kCanonicalLength);
+  } else {
+    WriteStrftime(fields, pattern, nullptr, out);
+  }
 }
 
 void WritePatternInLocale(const platform::BrokenDownTime& fields, const char* pattern,

@@ -8,6 +8,7 @@
 #include <string>
 
 #include "platform/zone/local_time.h"
+#include "text/canonical_text.h"
 
 namespace datetimelib {
 
@@ -16,6 +17,12 @@ namespace datetimelib {
 // digit, to the same text, without strftime.
 void WritePattern(const platform::BrokenDownTime& fields, const char* pattern,
                   std::string* out);
+
+// Writes the canonical text of `fields` into `text` when `pattern` is the
+// canonical pattern and the year has four digits, as strftime would; false
+// otherwise, with nothing written.
+bool WriteCanonicalText(const platform::BrokenDownTime& fields, const char* pattern,
+                        char (&text)[kCanonicalLength]);
 
 // The same in `locale` (not LC_GLOBAL_LOCALE); the empty text for a null locale,
 // which a handle holds only when the C library had no memory to open one.
