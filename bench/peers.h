@@ -6,6 +6,8 @@
 
 #include <benchmark/benchmark.h>
 
+#include <cstdint>
+
 #if DATETIMELIB_BENCH_ABSEIL
 #include <absl/time/civil_time.h>
 #include <absl/time/time.h>
@@ -25,6 +27,19 @@ const absl::TimeZone& AbseilZone();
 #endif
 #if DATETIMELIB_BENCH_DATE
 const date::time_zone* DateZone();
+
+// date's one breakdown: a zoned_time, then the date and the time of day.
+struct DateFields {
+  date::year_month_day date;
+  date::hh_mm_ss<std::chrono::seconds> time;
+};
+inline DateFields DateBreakdown(const date::time_zone* zone, std::int32_t count) {
+  const date::sys_seconds instant{std::chrono::seconds{count}};
+  const auto local =
+      date::zoned_time<std::chrono::seconds>{zone, instant}.get_local_time();
+  const auto day = date::floor<date::days>(local);
+  return {date::year_month_day{day}, date::hh_mm_ss<std::chrono::seconds>{local - day}};
+}
 #endif
 
 }  // namespace bench

@@ -115,14 +115,9 @@ void BM_Breakdown_Date(benchmark::State& state) {
   const date::time_zone* zone = bench::DateZone();
   std::size_t i = static_cast<std::size_t>(state.thread_index()) * 1000;
   for (auto _ : state) {
-    const date::sys_seconds instant{std::chrono::seconds{counts[At(i++)]}};
-    const auto local =
-        date::zoned_time<std::chrono::seconds>{zone, instant}.get_local_time();
-    const auto day = date::floor<date::days>(local);
-    const date::year_month_day date_fields{day};
-    const date::hh_mm_ss<std::chrono::seconds> time{local - day};
-    benchmark::DoNotOptimize(date_fields);
-    benchmark::DoNotOptimize(time.hours());
+    const bench::DateFields fields = bench::DateBreakdown(zone, counts[At(i++)]);
+    benchmark::DoNotOptimize(fields.date);
+    benchmark::DoNotOptimize(fields.time.hours());
   }
   state.SetItemsProcessed(state.iterations());
 }

@@ -26,6 +26,23 @@ struct EnvironmentGuard {
   }
 };
 
+struct Step {
+  void (*change)();
+  const char* tz;  // afterwards
+};
+
+// Before each step TZ reads as the watch last saw it; after it, the watch must
+// notice the change and, refreshed, report TZ's new value.
+void ExpectEachStepNoticed(TzWatch* watch, const std::vector<Step>& steps) {
+  for (const Step& step : steps) {
+    ASSERT_TRUE(watch->Unchanged());
+    step.change();
+    EXPECT_FALSE(watch->Unchanged()) << step.tz;
+    watch->Refresh();
+    EXPECT_EQ(watch->value().value_or("(unset)"), step.tz);
+  }
+}
+
 char tz_entry[] = "TZ=UTC0";  // given to putenv, then changed in place
 char long_tz_entry[] = "TZ=America/Argentina/Buenos_Aires";  // likewise, by word
 
@@ -38,10 +55,7 @@ TEST(TzWatch, NoticesEveryWayTzChanges) {
   TzWatch watch;
   EXPECT_FALSE(watch.Unchanged());  // nothing read yet
   watch.Refresh();
-  const struct {
-    void (*change)();
-    const char* tz;  // afterwards
-  } steps[] = {
+  const std::vector<Step> steps = {
       // setenv while unset: an entry past the end of the one read.
       {[] { setenv("TZ", "UTC", 1); }, "UTC"},
       // putenv: another string in TZ's place.
@@ -58,13 +72,7 @@ TEST(TzWatch, NoticesEveryWayTzChanges) {
       // unsetenv: nothing left of the value read before.
       {[] { unsetenv("TZ"); }, "(unset)"},
   };
-  for (const auto& step : steps) {
-    ASSERT_TRUE(watch.Unchanged());
-    step.change();
-    EXPECT_FALSE(watch.Unchanged()) << step.tz;
-    watch.Refresh();
-    EXPECT_EQ(watch.value().value_or("(unset)"), step.tz);
-  }
+  ExpectEachStepNoticed(&watch, steps);
 }
 
 // The environment shrinks to one entry while the watch remembers forty; under
@@ -96,10 +104,7 @@ TEST(TzWatch, ReadsOnlyTzsSlotOfTheFirstEnvironment) {
   environ = lasting;
   TzWatch watch(lasting);
   watch.Refresh();
-  const struct {
-    void (*change)();
-    const char* tz;  // afterwards
-  } steps[] = {
+  const std::vector<Step> steps = {
       {[] { lasting_tz[3 + 12] = 'X'; }, "Europe/LisboX"},
       // unsetenv moves the later entries down in place: TZ leaves its slot.
       {[] { unsetenv("A"); }, "Europe/LisboX"},
@@ -107,13 +112,7 @@ TEST(TzWatch, ReadsOnlyTzsSlotOfTheFirstEnvironment) {
       // Adding copies the array.
       {[] { setenv("TZ", "UTC", 1); }, "UTC"},
   };
-  for (const auto& step : steps) {
-    ASSERT_TRUE(watch.Unchanged());
-    step.change();
-    EXPECT_FALSE(watch.Unchanged()) << step.tz;
-    watch.Refresh();
-    EXPECT_EQ(watch.value().value_or("(unset)"), step.tz);
-  }
+  ExpectEachStepNoticed(&watch, steps);
 }
 
 }  // namespace
