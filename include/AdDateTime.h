@@ -21,7 +21,8 @@
 // any of them, starts no threads and takes no locks. The only state it keeps
 // between calls is each thread's own (its compiled zone and its last breakdown,
 // the locales it opened, the reading forms of the locales it read in last), and
-// none of it changes an answer. Any member may be called from many threads at once on distinct values.
+// none of it changes an answer. Any member may be called from many threads at
+// once on distinct values.
 //
 // Example:
 //

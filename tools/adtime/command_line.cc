@@ -6,7 +6,7 @@ namespace adtime {
 namespace {
 
 const OptionRule* FindOption(const std::string& name,
-                           const std::vector<OptionRule>& options) {
+                             const std::vector<OptionRule>& options) {
   for (const OptionRule& option : options) {
     if (name == option.name) return &option;
   }

@@ -20,7 +20,8 @@ std::string SonameOf(const dl_phdr_info& info) {
   const ElfW(Dyn)* dynamic = nullptr;
   for (ElfW(Half) i = 0; i < info.dlpi_phnum; ++i) {
     if (info.dlpi_phdr[i].p_type == PT_DYNAMIC) {
-      dynamic = reinterpret_cast<const ElfW(Dyn)*>(info.dlpi_addr + info.dlpi_phdr[i].p_vaddr);
+      dynamic =
+          reinterpret_cast<const ElfW(Dyn)*>(info.dlpi_addr + info.dlpi_phdr[i].p_vaddr);
     }
   }
   if (dynamic == nullptr) return "";

@@ -65,7 +65,8 @@ int main(int argc, char** argv) {
   if (name == "--version") {
     // The library may have been upgraded on its own: name the one loaded.
     const adtime::LoadedLibrary library = adtime::FindLoadedLibrary(ADTIME_LIBRARY_NAME);
-    std::printf("adtime %s\n%s %s (SONAME %s) from %s\n", ADTIME_VERSION, ADTIME_LIBRARY_NAME,
+    std::printf("adtime %s\n%s %s (SONAME %s) from %s\n", ADTIME_VERSION,
+                ADTIME_LIBRARY_NAME,
                 library.version.empty() ? "unknown" : library.version.c_str(),
                 library.soname.empty() ? "unknown" : library.soname.c_str(),
                 library.path.empty() ? "an unknown file" : library.path.c_str());
