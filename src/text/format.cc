@@ -3,6 +3,24 @@
 #include "platform/zone/local_time.h"
 #include "text/strftime_text.h"
 
+namespace {
+
+// `fields` written with `pattern` into a new string. The canonical text is built
+// straight into it: constructing a string from the 19 bytes costs less than
+// assigning them to an empty one.
+std::string FieldsText(const datetimelib::platform::BrokenDownTime& fields,
+                       const char* pattern) {
+  char canonical[datetimelib::kCanonicalLength];
+  if (datetimelib::WriteCanonicalText(fields, pattern, canonical)) {
+    return std::string(canonical, sizeof canonical);
+  }
+  std::string text;
+  datetimelib::WritePattern(fields, pattern, &text);
+  return text;
+}
+
+}  // namespace
+
 // What the formatters give for a value that is not valid (and for a valid one
 // with a null pattern): the kept text of an outOfRange value, else nothing.
 // Copied and cleared in place, so that `out` keeps its capacity.
@@ -31,30 +49,20 @@ void AdDateTime::FormatGMTInto(std::string& out, const char* pattern) const {
   datetimelib::WritePattern(datetimelib::platform::BreakDownUtc(seconds_), pattern, &out);
 }
 
-// The canonical text is built straight into the string returned: constructing
-// it from the 19 bytes costs less than assigning them to an empty one.
 std::string AdDateTime::Format(const char* pattern) const {
-  if (status_ == valid && pattern != nullptr) {
-    const auto fields = datetimelib::platform::BreakDownLocal(seconds_);
-    char canonical[datetimelib::kCanonicalLength];
-    if (datetimelib::WriteCanonicalText(fields, pattern, canonical)) {
-      return std::string(canonical, sizeof canonical);
-    }
-  }
   std::string text;
-  FormatInto(text, pattern);
-  return text;
+  if (status_ != valid || pattern == nullptr) {
+    WriteNotValid(text);
+    return text;
+  }
+  return FieldsText(datetimelib::platform::BreakDownLocal(seconds_), pattern);
 }
 
 std::string AdDateTime::FormatGMT(const char* pattern) const {
-  if (status_ == valid && pattern != nullptr) {
-    const auto fields = datetimelib::platform::BreakDownUtc(seconds_);
-    char canonical[datetimelib::kCanonicalLength];
-    if (datetimelib::WriteCanonicalText(fields, pattern, canonical)) {
-      return std::string(canonical, sizeof canonical);
-    }
-  }
   std::string text;
-  FormatGMTInto(text, pattern);
-  return text;
+  if (status_ != valid || pattern == nullptr) {
+    WriteNotValid(text);
+    return text;
+  }
+  return FieldsText(datetimelib::platform::BreakDownUtc(seconds_), pattern);
 }

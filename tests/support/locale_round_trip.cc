@@ -18,23 +18,12 @@ constexpr LocalTime kLocalTimes[] = {
     {2024, 2, 29, 22, 10, 5}, {2038, 1, 18, 22, 14, 7},
 };
 
-const char* FormName(LocaleForm form) {
-  switch (form) {
-    case LocaleForm::kDateAndTime:
-      return "date and time";
-    case LocaleForm::kTime:
-      return "time";
-    default:
-      return "date";
-  }
-}
-
 std::string CheckOne(const LocaleWriter& write, const AdDateTime& written,
                      LocaleForm form) {
   const std::string text = write(written, form);
   AdDateTime read;
   if (read.ParseDateTime(text.c_str()) != 1) {
-    return std::string(FormName(form)) + " \"" + text + "\" does not read";
+    return std::string(PatternOf(form)) + " \"" + text + "\" does not read";
   }
   std::string expected = text;
   if (form == LocaleForm::kTime) {
@@ -44,12 +33,23 @@ std::string CheckOne(const LocaleWriter& write, const AdDateTime& written,
   }
   const std::string again = write(read, form);
   if (again != expected) {
-    return std::string(FormName(form)) + " \"" + text + "\" reads as \"" + again + "\"";
+    return std::string(PatternOf(form)) + " \"" + text + "\" reads as \"" + again + "\"";
   }
   return "";
 }
 
 }  // namespace
+
+const char* PatternOf(LocaleForm form) {
+  switch (form) {
+    case LocaleForm::kDateAndTime:
+      return "%x %X";
+    case LocaleForm::kTime:
+      return "%X";
+    default:
+      return "%x";
+  }
+}
 
 std::string FirstRoundTripFailure(const LocaleWriter& write) {
   for (const LocalTime& t : kLocalTimes) {

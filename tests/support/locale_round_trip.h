@@ -13,6 +13,9 @@ namespace datetimelib::testing {
 
 enum class LocaleForm { kDateAndTime, kTime, kDate };
 
+// The strftime pattern of a form.
+const char* PatternOf(LocaleForm form);
+
 // Writes a value in one of the locale's forms.
 using LocaleWriter = std::function<std::string(const AdDateTime&, LocaleForm)>;
 

@@ -72,17 +72,6 @@ std::set<std::string> Exceptions(const std::string& readme) {
   return names;
 }
 
-const char* Pattern(LocaleForm form) {
-  switch (form) {
-    case LocaleForm::kDateAndTime:
-      return "%x %X";
-    case LocaleForm::kTime:
-      return "%X";
-    default:
-      return "%x";
-  }
-}
-
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -114,7 +103,7 @@ int main(int argc, char** argv) {
           std::string text;
           datetimelib::WritePatternInLocale(
               datetimelib::platform::BreakDownLocal(value.GetCTime().GetTime()),
-              Pattern(form), locale, &text);
+              datetimelib::testing::PatternOf(form), locale, &text);
           return text;
         });
     uselocale(previous);

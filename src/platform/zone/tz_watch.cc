@@ -27,20 +27,17 @@ __attribute__((section(".init_array"), used)) void (*const record_initial_enviro
 
 TzWatch::TzWatch() : lasting_(initial_environment) {}
 
+// Every case but the inline one: another array, or the lasting one with TZ unset.
 bool TzWatch::UnchangedAnyArray() const {
   char** const current = environ;
   if (current == nullptr || current != environment_) return false;
+  if (current == lasting_)
+    return true;  // TZ unset there: it can only come in a new array
   const std::size_t count = entries_.size();
-  if (current != lasting_) {
-    for (std::size_t i = 0; i < count; ++i) {
-      if (current[i] != entries_[i]) return false;
-    }
-    if (!value_) return current[count] == nullptr;
-  } else if (!value_) {
-    return true;  // TZ can only come in a new array
-  } else if (current[count - 1] != entries_[count - 1]) {
-    return false;
+  for (std::size_t i = 0; i < count; ++i) {
+    if (current[i] != entries_[i]) return false;
   }
+  if (!value_) return current[count] == nullptr;
   return SameBytes(entries_[count - 1] + 3, value_->c_str(), value_->size() + 1);
 }
 
